@@ -1,0 +1,33 @@
+#pragma once
+// A prompt for tests: records every message shown and answers from a queue
+// (the safe answer, No or Cancel, when the queue is empty).
+
+#include "catalog/prompt.h"
+
+#include <deque>
+#include <string>
+#include <vector>
+
+class CScriptedPrompt : public CPrompt
+{
+public:
+    struct Shown
+    {
+        std::string text;
+        std::string caption;
+        Icon icon;
+        Buttons buttons;
+    };
+
+    Answer MessageBox(const std::string& text, const std::string& caption, Icon icon,
+                      Buttons buttons) override;
+    void ShowReadMe(const std::string& text) override { readMeShown.push_back(text); }
+
+    void QueueAnswer(Answer answer) { answers.push_back(answer); }
+    // The one message shown, or an empty record when there was not exactly one.
+    Shown Only() const;
+
+    std::vector<Shown> shown;
+    std::vector<std::string> readMeShown;
+    std::deque<Answer> answers;
+};
