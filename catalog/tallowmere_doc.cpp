@@ -183,6 +183,8 @@ bool CTallowmereDoc::CreateCatalog()
 
 std::string CTallowmereDoc::ReadMeText()
 {
+    // The resources live in a static library; this pulls them in.
+    Q_INIT_RESOURCE(hearthbook);
     QFile file(QStringLiteral(":/hearthbook/README.txt"));
     if (!file.open(QIODevice::ReadOnly))
         return std::string();

@@ -1,0 +1,175 @@
+// hearthbook-cli end to end: creating, inspecting, dumping and rebuilding
+// catalogs, and its exit codes.
+
+#include "tests/support/catalog_fixture.h"
+#include "tests/support/cli_runner.h"
+#include "tests/support/hex_fixture.h"
+
+#include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QtTest>
+
+namespace {
+
+QStringList Home(const CCatalogFixture& f)
+{
+    return {"--home", QString::fromStdString(f.Home())};
+}
+
+void WriteText(const QString& path, const QByteArray& text)
+{
+    QFile file(path);
+    QVERIFY(file.open(QIODevice::WriteOnly));
+    file.write(text);
+}
+
+} // namespace
+
+class TestCli : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initThenInfo()
+    {
+        CCatalogFixture f;
+        CliResult r = RunCli(Home(f) + QStringList{"init"});
+        QCOMPARE(r.exitCode, 0);
+        QVERIFY(r.out.contains("Created catalog"));
+        QVERIFY(QFile::exists(QString::fromStdString(f.DataFile())));
+        // init never replaces a catalog.
+        const QByteArray before = f.ReadDataFile();
+        r = RunCli(Home(f) + QStringList{"init"});
+        QCOMPARE(r.exitCode, 3);
+        QCOMPARE(f.ReadDataFile(), before);
+
+        r = RunCli(Home(f) + QStringList{"info"});
+        QCOMPARE(r.exitCode, 0);
+        QVERIFY(r.out.contains("Format version: 6\n"));
+        QVERIFY(r.out.contains("Categories: 18\n"));
+        QVERIFY(r.out.contains("Pictures: 0\n"));
+        QVERIFY(r.out.contains(QByteArray("File size: ") + QByteArray::number(before.size())));
+    }
+
+    void dumpFollowsTheContract()
+    {
+        CCatalogFixture f;
+        f.WriteDataFile(LoadHexFixture("catalog/v6.hex"));
+        const CliResult r = RunCli(Home(f) + QStringList{"dump"});
+        QCOMPARE(r.exitCode, 0);
+        const QJsonObject o = QJsonDocument::fromJson(r.out).object();
+        QCOMPARE(o["formatVersion"].toInt(), 6);
+        QCOMPARE(o["creationDate"].toInteger(), 0x3F000000);
+        QCOMPARE(o["documentNumberCounter"].toInteger(), 7);
+        const QJsonObject picture = o["pictures"].toArray().at(0).toObject();
+        QCOMPARE(picture["name"].toString(), QString("Beach day"));
+        QCOMPARE(picture["fileSize"].toInteger(), 0x100001000ll);
+        QCOMPARE(picture["sequenceNumber"].toInt(), 1);
+        QCOMPARE(picture["intE"].toInt(), 5);
+        const QJsonObject album = o["documentSets"].toArray().at(0).toObject();
+        QCOMPARE(album["title"].toString(), QString("Summer 2003"));
+        QCOMPARE(album["members"].toArray().size(), 1);
+        const QJsonObject plain = o["documentSets"].toArray().at(1).toObject();
+        QCOMPARE(plain["albumFlag"].toInt(), 0);
+        QVERIFY(!plain.contains("title"));
+        const QJsonObject event = o["events"].toArray().at(0).toObject();
+        QCOMPARE(event["startDate"].toInteger(), -86400);
+        QCOMPARE(event["attendees"].toArray().at(1).toString(), QString("Bob"));
+        QCOMPARE(o["recipes"].toArray().at(0).toObject()["ingredients"].toArray().at(0)
+                     .toObject()["measurement"].toString(),
+                 QString("cups"));
+        QCOMPARE(o["settings"].toObject().keys().size(), 16);
+        QCOMPARE(o["settings"].toObject()["colorScheme"].toInt(), 1);
+    }
+
+    void dumpThenImportGivesTheSameFile()
+    {
+        CCatalogFixture f;
+        const QByteArray fixture = LoadHexFixture("catalog/v6.hex");
+        f.WriteDataFile(fixture);
+        const CliResult dump = RunCli(Home(f) + QStringList{"dump"});
+        QCOMPARE(dump.exitCode, 0);
+        const QString json = f.dir.path() + "/catalog.json";
+        WriteText(json, dump.out);
+        const QString copy = f.dir.path() + "/copy.hbi";
+        const CliResult import = RunCli({"--catalog", copy, "import-json", json});
+        QCOMPARE(import.exitCode, 0);
+        QFile file(copy);
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        QCOMPARE(file.readAll(), fixture);
+    }
+
+    void oldBytesAreShownAsWindows1252()
+    {
+        CCatalogFixture f;
+        auto doc = f.NewDoc();
+        QVERIFY(doc->StartUp());
+        doc->AddCategory("Caf\xE9 \x80", "EVENTS", 0);
+        QVERIFY(doc->SaveCatalog(false));
+        const CliResult r = RunCli(Home(f) + QStringList{"dump"});
+        const QJsonArray categories = QJsonDocument::fromJson(r.out).object()["categories"].toArray();
+        QCOMPARE(categories.last().toObject()["name"].toString(), QString::fromUtf8("Caf\u00e9 \u20ac"));
+    }
+
+    void exitCodes_data()
+    {
+        QTest::addColumn<QStringList>("arguments");
+        QTest::addColumn<QByteArray>("catalog"); // data file contents; empty: none
+        QTest::addColumn<QByteArray>("json");    // written to in.json when set
+        QTest::addColumn<int>("code");
+        QTest::addColumn<QString>("message");
+        const QByteArray v6 = LoadHexFixture("catalog/v6.hex");
+        QTest::newRow("no command") << QStringList{} << QByteArray() << QByteArray() << 1
+                                    << "no command given";
+        QTest::newRow("unknown command") << QStringList{"frobnicate"} << QByteArray()
+                                         << QByteArray() << 1 << "unknown command 'frobnicate'";
+        QTest::newRow("unknown option") << QStringList{"info", "--frob"} << QByteArray()
+                                        << QByteArray() << 1 << "Unknown option 'frob'";
+        QTest::newRow("stray argument") << QStringList{"info", "extra"} << v6 << QByteArray() << 1
+                                        << "info takes no arguments";
+        QTest::newRow("missing catalog") << QStringList{"info"} << QByteArray() << QByteArray()
+                                         << 2 << "file! The file could not be located.";
+        QTest::newRow("damaged catalog") << QStringList{"dump"} << v6.left(300) << QByteArray()
+                                         << 2 << "Read Data: Unable to read";
+        QTest::newRow("not JSON") << QStringList{"import-json", "in.json"} << QByteArray()
+                                  << QByteArray("{ nope") << 3 << "is not valid JSON";
+        QTest::newRow("line break in a line field")
+            << QStringList{"import-json", "in.json"} << QByteArray()
+            << QByteArray(R"({"pictures":[{"name":"a\nb"}]})") << 3
+            << "catalog.pictures[0].name holds a line break";
+        QTest::newRow("wrong type")
+            << QStringList{"import-json", "in.json"} << QByteArray()
+            << QByteArray(R"({"events":[{"startDate":"today"}]})") << 3
+            << "catalog.events[0].startDate must be a whole number";
+        QTest::newRow("version") << QStringList{"--version"} << QByteArray() << QByteArray() << 0
+                                 << "";
+    }
+
+    void exitCodes()
+    {
+        QFETCH(QStringList, arguments);
+        QFETCH(QByteArray, catalog);
+        QFETCH(QByteArray, json);
+        QFETCH(int, code);
+        QFETCH(QString, message);
+        CCatalogFixture f;
+        if (!catalog.isEmpty())
+            f.WriteDataFile(catalog);
+        if (!json.isEmpty())
+            WriteText(f.dir.path() + "/in.json", json);
+        for (QString& a : arguments) {
+            if (a == "in.json")
+                a = f.dir.path() + "/in.json";
+        }
+        const QByteArray before = f.ReadDataFile();
+        const CliResult r = RunCli(Home(f) + arguments);
+        QCOMPARE(r.exitCode, code);
+        QVERIFY2(r.err.contains(message.toUtf8()), r.err.constData());
+        QCOMPARE(f.ReadDataFile(), before); // a refused command writes nothing
+    }
+};
+
+QTEST_GUILESS_MAIN(TestCli)
+#include "tst_cli.moc"
