@@ -112,6 +112,10 @@ void CTallowmereDoc::RemoveAll()
     m_documentSets.clear();
     m_events.clear();
     m_categories.RemoveAll();
+    m_settings = CCatalogSettings();
+    m_creationDate = CTime();
+    m_reservedDate = CTime();
+    m_formatVersion = 0;
     m_sequenceCounter = 1;
     m_documentNumberCounter = 0;
     m_loadCounter = 0;
@@ -148,7 +152,6 @@ bool CTallowmereDoc::OpenCatalog(bool createIfMissing)
         Serialize(ar);
     } catch (const CArchiveException& e) {
         ::close(fd);
-        RemoveAll();
         m_prompt.MessageBox(
             StrFormat("Unable to read %s file! The file is damaged: %s (at byte %lld of %lld).",
                       m_dataFilePath.c_str(), e.what(), static_cast<long long>(e.GetOffset()),
@@ -170,11 +173,10 @@ bool CTallowmereDoc::CreateCatalog()
         return false;
     }
     ::close(fd);
+    RemoveAll();
     CFileStatus status;
     m_creationDate = CFileStatus::GetStatus(m_dataFilePath, status) ? status.createTime
                                                                      : CTime::GetCurrentTime();
-    RemoveAll();
-    m_reservedDate = CTime();
     m_categories.AddDefaultCategories();
     m_documentNumberCounter = 0;
     m_prompt.ShowReadMe(ReadMeText());
@@ -280,8 +282,17 @@ void CTallowmereDoc::Serialize(CArchive& ar)
         m_settings.Serialize(ar, kFormatVersion);
         return;
     }
-
     RemoveAll();
+    try {
+        Load(ar);
+    } catch (...) {
+        RemoveAll(); // nothing half-read stays behind
+        throw;
+    }
+}
+
+void CTallowmereDoc::Load(CArchive& ar)
+{
     const int version = ar.ReadInt();
     if (version < 1)
         ar.Fail(CArchiveException::BadVersion,
@@ -349,13 +360,17 @@ void CTallowmereDoc::Serialize(CArchive& ar)
         event->SetSequenceNumber(NextSequenceNumber());
         m_events.push_back(std::move(event));
     }
-    m_settings = CCatalogSettings();
     m_settings.Serialize(ar, version);
 }
 
 void CTallowmereDoc::RegisterItem(CCatalogItem& item)
 {
-    item.SetDocumentNumber(++m_documentNumberCounter);
+    // 0 means "not numbered", so a damaged counter must never hand it out.
+    do {
+        m_documentNumberCounter =
+            static_cast<int64_t>(static_cast<uint64_t>(m_documentNumberCounter) + 1);
+    } while (m_documentNumberCounter == 0);
+    item.SetDocumentNumber(m_documentNumberCounter);
     item.SetSequenceNumber(NextSequenceNumber());
     item.SetFlagB(0);
     if (item.GetCategoryPath().empty())

@@ -107,7 +107,7 @@ public:
     void AddObserver(std::function<void(int hint)> observer);
     void UpdateAllViews(int hint);
 
-    // Empties the catalog: no items, no categories, fresh counters.
+    // Empties the catalog: no items, no categories, default settings, fresh counters.
     void RemoveAll();
 
     // The read-me text shown when a new catalog is created.
@@ -115,6 +115,7 @@ public:
 
 private:
     bool WriteFile(std::string& error);
+    void Load(CArchive& ar);
 
     CPrompt& m_prompt;
     CAppFolders m_folders;
