@@ -2,11 +2,13 @@
 
 #include "catalog/text_util.h"
 
+#include <QDir>
 #include <QSettings>
 
 #include <cerrno>
 #include <cstdlib>
 #include <sys/stat.h>
+#include <unistd.h>
 
 namespace {
 
@@ -102,6 +104,25 @@ std::string CAppFolders::GetArchiveFolder(const std::string& categoryPath) const
     const std::string folder = GetArchiveRoot() + "/" + CategoryToFolder(categoryPath);
     if (!IsDirectory(folder))
         ::mkdir(folder.c_str(), 0777);
+    return folder;
+}
+
+std::string CAppFolders::GetTempFolder()
+{
+    const std::string runtime = EnvValue("XDG_RUNTIME_DIR");
+    const std::string folder =
+        !runtime.empty() && runtime.front() == '/'
+            ? runtime + "/hearthbook"
+            : WithoutTrailingSlash(QDir::tempPath().toStdString()) + "/hearthbook-" +
+                  std::to_string(::getuid());
+    if (::mkdir(folder.c_str(), 0700) != 0 && errno != EEXIST)
+        return std::string();
+    struct stat st;
+    // Never follow a link or use a folder another user made in a shared place.
+    if (::lstat(folder.c_str(), &st) != 0 || !S_ISDIR(st.st_mode) || st.st_uid != ::getuid())
+        return std::string();
+    if ((st.st_mode & 077) != 0 && ::chmod(folder.c_str(), 0700) != 0)
+        return std::string();
     return folder;
 }
 

@@ -28,6 +28,10 @@ public:
     bool CreateFolders() const;
 
     static bool CreateFolderPath(std::string path);
+    // The user's own temporary folder (mode 0700): $XDG_RUNTIME_DIR/hearthbook,
+    // else <temp>/hearthbook-<uid>. Made when missing; "" when a folder of that
+    // name belongs to someone else or is a link.
+    static std::string GetTempFolder();
     // 1 for a picture file, 2 for any other file.
     static int IsPictureFile(const std::string& path);
     // folder/base-yymmddHHMM.ext, or "" when the name has no dot.

@@ -13,6 +13,8 @@ public:
     virtual void SerializeVersioned(CArchive& ar, int version);
     void AppendTextLines(std::vector<std::string>& lines) const override;
     std::string GetMailText() const override;
+    // Offers the description with every member's file attached.
+    void Mail(CAppContext& context) override;
 
     virtual bool IsAlbum() const { return false; }
 

@@ -30,6 +30,20 @@ public:
     // The recipe record, then the common item record.
     void Serialize(CArchive& ar) override;
     int GetPrintLineCount() const override { return 30; }
+    // The recipe as printed and exported: title line, ingredients, directions.
+    void AppendTextLines(std::vector<std::string>& lines) const override;
+    std::string GetMailText() const override;
+    void Mail(CAppContext& context) override;
+    // Writes the page into the temporary folder and opens it.
+    bool ViewAsWebPage(CAppContext& context) override;
+    // Asks for a folder and writes the page there.
+    void WriteWebPages(CAppContext& context) override;
+
+    // Writes <folder>/<dish>_Recipe.html; false when it cannot be written.
+    bool WriteRecipePage(const std::string& folder);
+    const std::string& GetWebPagePath() const { return m_webPagePath; }
+    // "%6s   %-16s%s": amount, measurement, ingredient.
+    static std::string IngredientLine(const CIngredient& ingredient);
 
     const std::string& GetDirections() const { return m_directions; }
     void SetDirections(const std::string& text) { m_directions = text; }
@@ -48,4 +62,5 @@ private:
     std::string m_dish;
     std::string m_author;
     int32_t m_dialogMode = 1; // set by the recipe dialog
+    std::string m_webPagePath;
 };

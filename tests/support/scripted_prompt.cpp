@@ -27,3 +27,40 @@ CScriptedPrompt::Shown CScriptedPrompt::Only() const
         return {std::string(), std::string(), Icon::None, Buttons::Ok};
     return shown.front();
 }
+
+namespace {
+bool Take(std::deque<std::string>& queue, std::string& out)
+{
+    if (queue.empty())
+        return false;
+    out = queue.front();
+    queue.pop_front();
+    return true;
+}
+} // namespace
+
+bool CScriptedPrompt::OpenWithShell(const std::string& path)
+{
+    opened.push_back(path);
+    return true;
+}
+
+bool CScriptedPrompt::ChooseFolder(std::string& folder)
+{
+    dialogsShown.push_back("ChooseFolder");
+    return Take(folderAnswers, folder);
+}
+
+bool CScriptedPrompt::GetSaveFileName(const std::string& defaultExtension,
+                                      const std::string& filter, std::string& path)
+{
+    dialogsShown.push_back("GetSaveFileName " + defaultExtension + " " + filter);
+    return Take(saveFileAnswers, path);
+}
+
+bool CScriptedPrompt::ChoosePrinter(std::string& printerName, std::string& pdfPath)
+{
+    dialogsShown.push_back("ChoosePrinter");
+    printerName.clear();
+    return Take(pdfAnswers, pdfPath);
+}
