@@ -5,7 +5,7 @@
 #include "cli/cli_command.h"
 #include "cli/console_prompt.h"
 
-#include <QCoreApplication>
+#include <QGuiApplication>
 #include <QTextStream>
 
 #include <cstdio>
@@ -56,7 +56,11 @@ QString GeneralHelp(QCommandLineParser& parser)
 
 int main(int argc, char** argv)
 {
-    QCoreApplication app(argc, argv);
+    // Pictures and printing need the GUI application object; the command line
+    // never shows a window, so it always runs offscreen.
+    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+    QGuiApplication app(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Veltrano"));
     QCoreApplication::setApplicationName(QStringLiteral("Hearthbook"));
     QCoreApplication::setApplicationVersion(QStringLiteral("1.3.11"));

@@ -7,6 +7,7 @@
 #include "output/print_job.h"
 
 #include <QFontDatabase>
+#include <QGuiApplication>
 #include <QPageSize>
 #include <QPainter>
 #include <QPdfWriter>
@@ -40,6 +41,9 @@ std::vector<CPrintPage> LayOutDataItemPages(const std::vector<const CCatalogItem
 
 bool DrawTextPages(QPagedPaintDevice& device, const std::vector<CPrintPage>& pages)
 {
+    // Fonts need the GUI application object (the command line makes an offscreen one).
+    if (!qobject_cast<QGuiApplication*>(QCoreApplication::instance()))
+        return false;
     QPainter painter;
     if (!painter.begin(&device))
         return false;
