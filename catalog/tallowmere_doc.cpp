@@ -487,6 +487,26 @@ std::vector<CCategory*> CTallowmereDoc::GetCategoriesUnder(const std::string& ro
     return m_categories.GetCategoriesUnder(root);
 }
 
+CCatalogItem* CTallowmereDoc::FindItemBySequence(int32_t sequenceNumber) const
+{
+    if (CDocumentItem* item = m_pictures.FindBySequence(sequenceNumber))
+        return item;
+    if (CDocumentItem* item = m_documents.FindBySequence(sequenceNumber))
+        return item;
+    const auto find = [sequenceNumber](const auto& list) -> CCatalogItem* {
+        for (const auto& item : list) {
+            if (item->GetSequenceNumber() == sequenceNumber)
+                return item.get();
+        }
+        return nullptr;
+    };
+    if (CCatalogItem* item = find(m_recipes))
+        return item;
+    if (CCatalogItem* item = find(m_documentSets))
+        return item;
+    return find(m_events);
+}
+
 void CTallowmereDoc::AddObserver(std::function<void(int)> observer)
 {
     m_observers.push_back(std::move(observer));

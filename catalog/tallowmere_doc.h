@@ -103,6 +103,9 @@ public:
     CPrompt& GetPrompt() const { return m_prompt; }
     CAppContext& GetContext() { return m_context; }
 
+    // The catalog's own item with that sequence number, in any list; nullptr when none.
+    CCatalogItem* FindItemBySequence(int32_t sequenceNumber) const;
+
     // Views register to be told to update; hint 1 means "everything".
     void AddObserver(std::function<void(int hint)> observer);
     void UpdateAllViews(int hint);

@@ -1,5 +1,6 @@
 #include "cli/console_prompt.h"
 
+#include <cstdio>
 #include <string>
 
 CPrompt::Answer CConsolePrompt::MessageBox(const std::string& text, const std::string& caption,
@@ -30,4 +31,11 @@ CPrompt::Answer CConsolePrompt::MessageBox(const std::string& text, const std::s
         return m_questionAnswer;
     }
     return Answer::Cancel;
+}
+
+bool CConsolePrompt::OpenWithShell(const std::string& path)
+{
+    // A command line does not start desktop programs; it says where the file is.
+    std::printf("%s\n", path.c_str());
+    return true;
 }

@@ -19,7 +19,37 @@ public:
     // How many errors (stop or exclamation messages) were shown.
     int ErrorCount() const { return m_errors; }
 
+    // Dialogs answer from the command line's options; unset means cancelled.
+    bool ChooseFolder(std::string& folder) override { return Given(m_folder, folder); }
+    bool GetSaveFileName(const std::string&, const std::string&, std::string& path) override
+    {
+        return Given(m_saveFile, path);
+    }
+    bool ChoosePrinter(std::string& printerName, std::string& pdfPath) override
+    {
+        printerName = m_printer;
+        return Given(m_pdfFile, pdfPath) || !m_printer.empty();
+    }
+    bool OpenWithShell(const std::string& path) override;
+
+    void SetFolder(const std::string& folder) { m_folder = folder; }
+    void SetSaveFile(const std::string& path) { m_saveFile = path; }
+    void SetPdfFile(const std::string& path) { m_pdfFile = path; }
+    void SetPrinter(const std::string& name) { m_printer = name; }
+
 private:
-    Answer m_questionAnswer;
+    static bool Given(const std::string& given, std::string& out)
+    {
+        if (given.empty())
+            return false;
+        out = given;
+        return true;
+    }
+
+    CPrompt::Answer m_questionAnswer;
     int m_errors = 0;
+    std::string m_folder;
+    std::string m_saveFile;
+    std::string m_pdfFile;
+    std::string m_printer;
 };

@@ -52,6 +52,15 @@ QString GeneralHelp(QCommandLineParser& parser)
     return text;
 }
 
+// Qt's own notes about the offscreen session mean nothing to a command-line user.
+void QuietMessages(QtMsgType type, const QMessageLogContext& context, const QString& message)
+{
+    if (type == QtWarningMsg && message.startsWith(QLatin1String("QStandardPaths: ")))
+        return;
+    (void)context;
+    std::fprintf(stderr, "%s\n", qPrintable(message));
+}
+
 } // namespace
 
 int main(int argc, char** argv)
@@ -60,6 +69,7 @@ int main(int argc, char** argv)
     // never shows a window, so it always runs offscreen.
     if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
         qputenv("QT_QPA_PLATFORM", "offscreen");
+    qInstallMessageHandler(QuietMessages);
     QGuiApplication app(argc, argv);
     QCoreApplication::setOrganizationName(QStringLiteral("Veltrano"));
     QCoreApplication::setApplicationName(QStringLiteral("Hearthbook"));

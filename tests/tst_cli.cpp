@@ -9,6 +9,7 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
+#include <QProcess>
 #include <QtTest>
 
 namespace {
@@ -111,6 +112,43 @@ private slots:
         const CliResult r = RunCli(Home(f) + QStringList{"dump"});
         const QJsonArray categories = QJsonDocument::fromJson(r.out).object()["categories"].toArray();
         QCOMPARE(categories.last().toObject()["name"].toString(), QString::fromUtf8("Caf\u00e9 \u20ac"));
+    }
+
+    void outputCommands()
+    {
+        CCatalogFixture f;
+        f.WriteDataFile(LoadHexFixture("catalog/v6.hex"));
+        const auto doc = f.Open();
+        QVERIFY(doc);
+        const std::string expected = doc->FindItemBySequence(3)->GetMailText() +
+                                     doc->FindItemBySequence(6)->GetMailText();
+        CliResult r = RunCli(Home(f) + QStringList{"text", "3", "6"});
+        QCOMPARE(r.exitCode, 0);
+        QCOMPARE(r.out.toStdString(), expected);
+
+        const QString pdf = f.dir.path() + "/items.pdf";
+        r = RunCli(Home(f) + QStringList{"print", "3", "--pdf", pdf});
+        QCOMPARE(r.exitCode, 0);
+        QProcess text;
+        text.start("pdftotext", {pdf, "-"});
+        QVERIFY(text.waitForFinished());
+        QVERIFY(text.readAllStandardOutput().contains("Recipe for Pancakes"));
+
+        r = RunCli(Home(f) + QStringList{"recipe-html", "3", "--folder", f.dir.path() + "/web"});
+        QCOMPARE(r.exitCode, 0);
+        QVERIFY(QFile::exists(f.dir.path() + "/web/Pancakes_Recipe.html"));
+        r = RunCli(Home(f) + QStringList{"recipe-html", "6", "--folder", f.dir.path()});
+        QCOMPARE(r.exitCode, 3);
+        QVERIFY(r.err.contains("item 6 is not a recipe"));
+
+        qputenv("HEARTHBOOK_MAIL_COMMAND", HB_TEST_DATA "/mail-recorder.sh");
+        qputenv("HB_MAIL_RECORD", (f.dir.path() + "/mail").toLocal8Bit());
+        r = RunCli(Home(f) + QStringList{"mail", "6"});
+        QCOMPARE(r.exitCode, 0);
+        QFile record(f.dir.path() + "/mail");
+        QVERIFY(record.open(QIODevice::ReadOnly));
+        QVERIFY(record.readAll().contains("Birthday was for Ann turns 40."));
+        qunsetenv("HEARTHBOOK_MAIL_COMMAND");
     }
 
     void exitCodes_data()
