@@ -4,6 +4,8 @@
 
 #include "catalog/item_list.h"
 
+class CWebSite;
+
 class CDocumentSetBase : public CCatalogItem
 {
 public:
@@ -60,6 +62,14 @@ public:
     // The set record, then the album attributes when the album flag is set.
     void SerializeVersioned(CArchive& ar, int version) override;
     bool IsAlbum() const override { return true; }
+    // Generates the pages into the temporary folder and opens the index.
+    bool ViewAsWebPage(CAppContext& context) override;
+
+    // Writes the index (the site's master page), one page per picturesPerPage
+    // pictures and a numbered copy of every picture into folder. False when
+    // the folder cannot be made or the index cannot be written; pictures
+    // that could not be copied are counted in failedCopies.
+    bool CreateWebPages(CWebSite& site, const std::string& folder, int* failedCopies = nullptr);
 
     int32_t GetPicturesPerPage() const { return m_picturesPerPage; }
     void SetPicturesPerPage(int32_t n) { m_picturesPerPage = n; }
@@ -78,7 +88,9 @@ public:
     // 0x00BBGGRR
     uint32_t GetBackgroundColor() const { return m_backgroundColor; }
     void SetBackgroundColor(uint32_t color) { m_backgroundColor = color; }
-    std::vector<std::shared_ptr<CDocumentItem>>& GetGeneratedFiles() { return m_generatedFiles; }
+    // The files the last web-page generation wrote: copies, pages, the index last.
+    CItemList& GetGeneratedFiles() { return m_generatedFiles; }
+    const CItemList& GetGeneratedFiles() const { return m_generatedFiles; }
     const std::string& GetIndexFileName() const { return m_indexFileName; }
     void SetIndexFileName(const std::string& name) { m_indexFileName = name; }
     int32_t GetPageFlag() const { return m_pageFlag; }
@@ -93,7 +105,7 @@ private:
     std::string m_title;
     std::string m_indexPath;
     uint32_t m_backgroundColor = 0xFFFFFF;
-    std::vector<std::shared_ptr<CDocumentItem>> m_generatedFiles;
+    CItemList m_generatedFiles;
     std::string m_indexFileName;
     int32_t m_pageFlag = 1;
 };

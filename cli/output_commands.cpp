@@ -3,6 +3,7 @@
 #include "catalog/tallowmere_doc.h"
 #include "cli/cli_command.h"
 #include "cli/console_prompt.h"
+#include "output/album_pages.h"
 #include "output/data_item_print.h"
 
 #include <QCommandLineOption>
@@ -95,6 +96,24 @@ int RunRecipeHtml(CliContext& c)
     return kExitOk;
 }
 
+int RunAlbumHtml(CliContext& c)
+{
+    if (c.arguments.size() != 1 || !c.parser.isSet(QStringLiteral("folder")))
+        return c.Usage(QStringLiteral("album-html takes one photo album and --folder DIR"));
+    const auto doc = c.OpenCatalog();
+    if (!doc)
+        return kExitCatalog;
+    std::vector<CCatalogItem*> items;
+    if (!ItemsFromArguments(c, *doc, items))
+        return kExitFailure;
+    auto* set = dynamic_cast<CDocumentSet*>(items.front());
+    if (!set || !set->IsAlbum())
+        return c.Failure(QStringLiteral("item %1 is not a photo album").arg(c.arguments.front()));
+    auto& album = static_cast<CPhotoAlbum&>(*set);
+    const std::string folder = c.parser.value(QStringLiteral("folder")).toStdString();
+    return SaveAlbumWebPages(c.prompt, album, folder) ? kExitOk : kExitFailure;
+}
+
 int RunMail(CliContext& c)
 {
     const auto doc = c.OpenCatalog();
@@ -143,6 +162,10 @@ const CliRegistration kPrint{
 const CliRegistration kRecipeHtml{
     {QStringLiteral("recipe-html"), QStringLiteral("SEQ --folder DIR"),
      QStringLiteral("Write a recipe's web page into a folder."), FolderOption, RunRecipeHtml}};
+const CliRegistration kAlbumHtml{
+    {QStringLiteral("album-html"), QStringLiteral("SETSEQ --folder DIR"),
+     QStringLiteral("Write a photo album's index, pages and picture copies into a folder."),
+     FolderOption, RunAlbumHtml}};
 const CliRegistration kMail{{QStringLiteral("mail"), QStringLiteral("SEQ..."),
                              QStringLiteral("Hand items to the mail program (xdg-email)."),
                              nullptr, RunMail}};
