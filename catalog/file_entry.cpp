@@ -1,6 +1,7 @@
 #include "catalog/file_entry.h"
 
 #include "catalog/app_folders.h"
+#include "catalog/file_copy.h"
 #include "catalog/prompt.h"
 #include "catalog/text_util.h"
 
@@ -12,96 +13,6 @@
 #include <unistd.h>
 
 namespace {
-
-class Fd
-{
-public:
-    explicit Fd(int fd) : m_fd(fd) {}
-    ~Fd()
-    {
-        if (m_fd >= 0)
-            ::close(m_fd);
-    }
-    Fd(const Fd&) = delete;
-    Fd& operator=(const Fd&) = delete;
-    int get() const { return m_fd; }
-    int release()
-    {
-        const int fd = m_fd;
-        m_fd = -1;
-        return fd;
-    }
-
-private:
-    int m_fd;
-};
-
-// Copies source to a new file target (never over an existing one), keeping
-// the modification time. Returns 0 or the errno of the failure.
-int CopyNewFile(const std::string& source, const std::string& target)
-{
-    Fd in(::open(source.c_str(), O_RDONLY | O_CLOEXEC));
-    if (in.get() < 0)
-        return errno;
-    struct stat st;
-    if (::fstat(in.get(), &st) != 0)
-        return errno;
-    if (!S_ISREG(st.st_mode))
-        return EISDIR;
-    Fd out(::open(target.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, st.st_mode & 0666));
-    if (out.get() < 0)
-        return errno;
-    int error = 0;
-    bool useRange = true;
-    char buffer[1 << 16];
-    for (;;) {
-        ssize_t n;
-        if (useRange) {
-            n = ::copy_file_range(in.get(), nullptr, out.get(), nullptr, 1 << 30, 0);
-            if (n < 0 && (errno == EXDEV || errno == ENOSYS || errno == EINVAL ||
-                          errno == EOPNOTSUPP)) {
-                useRange = false;
-                continue;
-            }
-        } else {
-            n = ::read(in.get(), buffer, sizeof buffer);
-            if (n > 0) {
-                const char* p = buffer;
-                ssize_t left = n;
-                while (left > 0) {
-                    const ssize_t w = ::write(out.get(), p, static_cast<size_t>(left));
-                    if (w < 0 && errno == EINTR)
-                        continue;
-                    if (w <= 0) {
-                        error = w < 0 ? errno : ENOSPC;
-                        break;
-                    }
-                    p += w;
-                    left -= w;
-                }
-                if (error)
-                    break;
-            }
-        }
-        if (n < 0 && errno == EINTR)
-            continue;
-        if (n < 0) {
-            error = errno;
-            break;
-        }
-        if (n == 0)
-            break;
-    }
-    if (!error) {
-        const struct timespec times[2] = {st.st_atim, st.st_mtim};
-        ::futimens(out.get(), times);
-    }
-    if (::close(out.release()) != 0 && !error)
-        error = errno;
-    if (error)
-        ::unlink(target.c_str());
-    return error;
-}
 
 // The source folder as it is mirrored below the archive root: absolute,
 // with nothing that could climb out of the root.
@@ -180,7 +91,7 @@ std::string CFileEntry::ArchiveFile(CPrompt& prompt, bool showMessage, CTime now
         // A second copy within the same minute gets -2, -3 ... instead of failing.
         for (int attempt = 1; attempt < 100000; ++attempt) {
             targetPath = WithAttempt(base, attempt);
-            error = CopyNewFile(m_name, targetPath);
+            error = CopyFileTo(m_name, targetPath);
             if (error != EEXIST)
                 break;
         }
@@ -201,23 +112,26 @@ std::string CFileEntry::ArchiveFile(CPrompt& prompt, bool showMessage, CTime now
 
 bool CFileEntry::ReadWholeFile(CPrompt& prompt)
 {
-    Fd fd(::open(m_path.c_str(), O_RDONLY | O_CLOEXEC));
-    if (fd.get() < 0)
+    const int fd = ::open(m_path.c_str(), O_RDONLY | O_CLOEXEC);
+    if (fd < 0)
         return false;
     struct stat st;
-    if (::fstat(fd.get(), &st) != 0 || !S_ISREG(st.st_mode))
+    if (::fstat(fd, &st) != 0 || !S_ISREG(st.st_mode)) {
+        ::close(fd);
         return false;
+    }
     const auto length = static_cast<size_t>(st.st_size);
     m_data.assign(length, '\0');
     size_t done = 0;
     while (done < length) {
-        const ssize_t n = ::read(fd.get(), m_data.data() + done, length - done);
+        const ssize_t n = ::read(fd, m_data.data() + done, length - done);
         if (n < 0 && errno == EINTR)
             continue;
         if (n <= 0)
             break;
         done += static_cast<size_t>(n);
     }
+    ::close(fd);
     if (done == length)
         return true;
     m_data.resize(done);

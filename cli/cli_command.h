@@ -41,6 +41,8 @@ struct CliCommand
     QString description; // one line
     std::function<void(QCommandLineParser&)> addOptions;
     std::function<int(CliContext&)> run;
+    // Pictures, fonts and printing need the (offscreen) GUI application.
+    bool needsGui = false;
 };
 
 std::vector<CliCommand>& CliCommands();

@@ -9,6 +9,7 @@
 #include <QTextStream>
 
 #include <cstdio>
+#include <memory>
 
 namespace {
 
@@ -65,17 +66,28 @@ void QuietMessages(QtMsgType type, const QMessageLogContext& context, const QStr
 
 int main(int argc, char** argv)
 {
-    // Pictures and printing need the GUI application object; the command line
-    // never shows a window, so it always runs offscreen.
-    if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-    qInstallMessageHandler(QuietMessages);
-    QGuiApplication app(argc, argv);
+    QStringList args;
+    for (int i = 0; i < argc; ++i)
+        args << QString::fromLocal8Bit(argv[i]);
+    const int index = CommandIndex(args);
+    const CliCommand* command = index > 0 ? FindCommand(args.at(index)) : nullptr;
+
+    // Pictures and printing need the GUI application object, which takes a
+    // tenth of a second to start; the command line never shows a window, so
+    // it runs offscreen, and only for the commands that need it.
+    std::unique_ptr<QCoreApplication> app;
+    if (command && command->needsGui) {
+        if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM"))
+            qputenv("QT_QPA_PLATFORM", "offscreen");
+        qInstallMessageHandler(QuietMessages);
+        app = std::make_unique<QGuiApplication>(argc, argv);
+    } else {
+        app = std::make_unique<QCoreApplication>(argc, argv);
+    }
     QCoreApplication::setOrganizationName(QStringLiteral("Veltrano"));
     QCoreApplication::setApplicationName(QStringLiteral("Hearthbook"));
     QCoreApplication::setApplicationVersion(QStringLiteral("1.3.11"));
 
-    const QStringList args = QCoreApplication::arguments();
     QCommandLineParser parser;
     parser.setApplicationDescription(
         QStringLiteral("Hearthbook catalog on the command line.\n"
@@ -98,8 +110,6 @@ int main(int argc, char** argv)
     parser.addOption(helpOption);
     parser.addOption(versionOption);
 
-    const int index = CommandIndex(args);
-    const CliCommand* command = index > 0 ? FindCommand(args.at(index)) : nullptr;
     if (command) {
         parser.addPositionalArgument(command->name, command->description,
                                      command->name + QLatin1Char(' ') + command->synopsis);

@@ -158,7 +158,7 @@ const CliRegistration kText{
      TextOptions, RunText}};
 const CliRegistration kPrint{
     {QStringLiteral("print"), QStringLiteral("SEQ... --pdf FILE | --printer QUEUE"),
-     QStringLiteral("Print data items, 80 lines a page."), PrintOptions, RunPrint}};
+     QStringLiteral("Print data items, 80 lines a page."), PrintOptions, RunPrint, true}};
 const CliRegistration kRecipeHtml{
     {QStringLiteral("recipe-html"), QStringLiteral("SEQ --folder DIR"),
      QStringLiteral("Write a recipe's web page into a folder."), FolderOption, RunRecipeHtml}};

@@ -3,11 +3,13 @@
 #include "catalog/app_context.h"
 #include "catalog/app_folders.h"
 #include "catalog/document_set.h"
+#include "catalog/file_copy.h"
 #include "catalog/prompt.h"
 #include "catalog/text_util.h"
 #include "output/html_page.h"
 #include "output/safe_file_name.h"
 
+#include <QBuffer>
 #include <QImageReader>
 
 #include <filesystem>
@@ -24,12 +26,20 @@ std::string ExtensionOf(const std::string& path)
     return extension.size() == 3 ? extension : std::string();
 }
 
-// The picture's stored size, read from the file's header only.
-CThumbnailBox PictureSize(const std::string& path)
+// The picture's stored size, from the start of the file when that holds
+// the header (it nearly always does), else from the file.
+CThumbnailBox PictureSize(const std::string& head, const std::string& path)
 {
-    QImageReader reader(QString::fromStdString(path));
-    reader.setAutoTransform(false);
-    const QSize size = reader.size();
+    QByteArray bytes = QByteArray::fromRawData(head.data(), static_cast<qsizetype>(head.size()));
+    QBuffer buffer(&bytes);
+    QImageReader fromHead(&buffer);
+    fromHead.setAutoTransform(false);
+    QSize size = fromHead.size();
+    if (!size.isValid()) {
+        QImageReader fromFile(QString::fromStdString(path));
+        fromFile.setAutoTransform(false);
+        size = fromFile.size();
+    }
     return {size.width(), size.height()};
 }
 
@@ -149,16 +159,18 @@ bool CPhotoAlbum::CreateWebPages(CWebSite& site, const std::string& folder, int*
                                            ? picture.GetPathname()
                                            : picture.GetOriginalPathname();
             const std::string copyPath = folder + "/" + picName;
-            std::error_code error;
-            std::filesystem::copy_file(source, copyPath,
-                                       std::filesystem::copy_options::overwrite_existing, error);
-            if (error && failedCopies)
+            std::string head;
+            CCopyOptions copy;
+            copy.overwrite = true;
+            copy.head = &head;
+            copy.headBytes = 128 * 1024; // past a full-size EXIF block to the frame header
+            if (CopyFileTo(source, copyPath, copy) != 0 && failedCopies)
                 ++*failedCopies;
             m_generatedFiles.Append(GeneratedFile(copyPath));
             if (n == 0)
                 row = table->AddRow(new CHtmlRow);
             ++n;
-            const CThumbnailBox pictureSize = PictureSize(source);
+            const CThumbnailBox pictureSize = PictureSize(head, source);
             const CThumbnailBox fitted =
                 AlbumThumbnailSize(pictureSize.width, pictureSize.height, box);
             CHtmlCell* cell = row->AddCell(new CHtmlCell);

@@ -1,0 +1,18 @@
+#pragma once
+// Copying one file to another, the way archiving and page generation need it.
+
+#include <string>
+
+struct CCopyOptions
+{
+    bool overwrite = false; // false: fail with EEXIST rather than replace a file
+    // When set, receives up to headBytes bytes from the start of the file (read
+    // on the way, so a caller can look at a picture's header without reopening it).
+    std::string* head = nullptr;
+    size_t headBytes = 0;
+};
+
+// Copies source to target keeping its modification time; a failed copy leaves
+// no partial target behind. Returns 0 or the errno of the failure.
+int CopyFileTo(const std::string& source, const std::string& target,
+               const CCopyOptions& options = {});
