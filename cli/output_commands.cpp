@@ -12,25 +12,40 @@
 
 namespace {
 
-// The catalog's items named by sequence numbers; false after telling why.
-bool ItemsFromArguments(const CliContext& c, const CTallowmereDoc& doc,
-                        std::vector<CCatalogItem*>& items)
+// Opens the catalog and finds the items the arguments name by sequence
+// number. Returns kExitOk, or the exit code after telling why not.
+int OpenWithItems(const CliContext& c, std::unique_ptr<CTallowmereDoc>& doc,
+                  std::vector<CCatalogItem*>& items)
 {
-    if (c.arguments.isEmpty()) {
-        c.Usage(QStringLiteral("name at least one item by its sequence number"));
-        return false;
-    }
+    if (c.arguments.isEmpty())
+        return c.Usage(QStringLiteral("name at least one item by its sequence number"));
+    doc = c.OpenCatalog();
+    if (!doc)
+        return kExitCatalog;
     for (const QString& argument : c.arguments) {
         bool ok = false;
         const int sequence = argument.toInt(&ok);
-        CCatalogItem* item = ok ? doc.FindItemBySequence(sequence) : nullptr;
-        if (!item) {
-            c.Failure(QStringLiteral("no item has the sequence number '%1'").arg(argument));
-            return false;
-        }
+        CCatalogItem* item = ok ? doc->FindItemBySequence(sequence) : nullptr;
+        if (!item)
+            return c.Failure(QStringLiteral("no item has the sequence number '%1'").arg(argument));
         items.push_back(item);
     }
-    return true;
+    return kExitOk;
+}
+
+// The one item of a command that writes pages into --folder.
+int OpenWithPageItem(const CliContext& c, const QString& what,
+                     std::unique_ptr<CTallowmereDoc>& doc, CCatalogItem*& item,
+                     std::string& folder)
+{
+    if (c.arguments.size() != 1 || !c.parser.isSet(QStringLiteral("folder")))
+        return c.Usage(QStringLiteral("%1 takes one item and --folder DIR").arg(what));
+    std::vector<CCatalogItem*> items;
+    if (const int exit = OpenWithItems(c, doc, items))
+        return exit;
+    item = items.front();
+    folder = c.parser.value(QStringLiteral("folder")).toStdString();
+    return kExitOk;
 }
 
 std::vector<const CCatalogItem*> AsConst(const std::vector<CCatalogItem*>& items)
@@ -40,12 +55,10 @@ std::vector<const CCatalogItem*> AsConst(const std::vector<CCatalogItem*>& items
 
 int RunText(CliContext& c)
 {
-    const auto doc = c.OpenCatalog();
-    if (!doc)
-        return kExitCatalog;
+    std::unique_ptr<CTallowmereDoc> doc;
     std::vector<CCatalogItem*> items;
-    if (!ItemsFromArguments(c, *doc, items))
-        return c.arguments.isEmpty() ? kExitUsage : kExitFailure;
+    if (const int exit = OpenWithItems(c, doc, items))
+        return exit;
     const std::string text = DataItemsText(AsConst(items));
     if (!c.parser.isSet(QStringLiteral("out"))) {
         std::fwrite(text.data(), 1, text.size(), stdout);
@@ -61,12 +74,10 @@ int RunPrint(CliContext& c)
     const bool printer = c.parser.isSet(QStringLiteral("printer"));
     if (pdf == printer)
         return c.Usage(QStringLiteral("print needs either --pdf FILE or --printer QUEUE"));
-    const auto doc = c.OpenCatalog();
-    if (!doc)
-        return kExitCatalog;
+    std::unique_ptr<CTallowmereDoc> doc;
     std::vector<CCatalogItem*> items;
-    if (!ItemsFromArguments(c, *doc, items))
-        return c.arguments.isEmpty() ? kExitUsage : kExitFailure;
+    if (const int exit = OpenWithItems(c, doc, items))
+        return exit;
     if (pdf)
         c.prompt.SetPdfFile(c.parser.value(QStringLiteral("pdf")).toStdString());
     else
@@ -76,18 +87,14 @@ int RunPrint(CliContext& c)
 
 int RunRecipeHtml(CliContext& c)
 {
-    if (c.arguments.size() != 1 || !c.parser.isSet(QStringLiteral("folder")))
-        return c.Usage(QStringLiteral("recipe-html takes one recipe and --folder DIR"));
-    const auto doc = c.OpenCatalog();
-    if (!doc)
-        return kExitCatalog;
-    std::vector<CCatalogItem*> items;
-    if (!ItemsFromArguments(c, *doc, items))
-        return kExitFailure;
-    auto* recipe = dynamic_cast<CRecipeItem*>(items.front());
+    std::unique_ptr<CTallowmereDoc> doc;
+    CCatalogItem* item = nullptr;
+    std::string folder;
+    if (const int exit = OpenWithPageItem(c, QStringLiteral("recipe-html"), doc, item, folder))
+        return exit;
+    auto* recipe = dynamic_cast<CRecipeItem*>(item);
     if (!recipe)
         return c.Failure(QStringLiteral("item %1 is not a recipe").arg(c.arguments.front()));
-    const std::string folder = c.parser.value(QStringLiteral("folder")).toStdString();
     CAppFolders::CreateFolderPath(folder);
     if (!recipe->WriteRecipePage(folder))
         return c.Failure(QStringLiteral("cannot write %1")
@@ -98,30 +105,24 @@ int RunRecipeHtml(CliContext& c)
 
 int RunAlbumHtml(CliContext& c)
 {
-    if (c.arguments.size() != 1 || !c.parser.isSet(QStringLiteral("folder")))
-        return c.Usage(QStringLiteral("album-html takes one photo album and --folder DIR"));
-    const auto doc = c.OpenCatalog();
-    if (!doc)
-        return kExitCatalog;
-    std::vector<CCatalogItem*> items;
-    if (!ItemsFromArguments(c, *doc, items))
-        return kExitFailure;
-    auto* set = dynamic_cast<CDocumentSet*>(items.front());
+    std::unique_ptr<CTallowmereDoc> doc;
+    CCatalogItem* item = nullptr;
+    std::string folder;
+    if (const int exit = OpenWithPageItem(c, QStringLiteral("album-html"), doc, item, folder))
+        return exit;
+    auto* set = dynamic_cast<CDocumentSet*>(item);
     if (!set || !set->IsAlbum())
         return c.Failure(QStringLiteral("item %1 is not a photo album").arg(c.arguments.front()));
     auto& album = static_cast<CPhotoAlbum&>(*set);
-    const std::string folder = c.parser.value(QStringLiteral("folder")).toStdString();
     return SaveAlbumWebPages(c.prompt, album, folder) ? kExitOk : kExitFailure;
 }
 
 int RunMail(CliContext& c)
 {
-    const auto doc = c.OpenCatalog();
-    if (!doc)
-        return kExitCatalog;
+    std::unique_ptr<CTallowmereDoc> doc;
     std::vector<CCatalogItem*> items;
-    if (!ItemsFromArguments(c, *doc, items))
-        return c.arguments.isEmpty() ? kExitUsage : kExitFailure;
+    if (const int exit = OpenWithItems(c, doc, items))
+        return exit;
     const int errorsBefore = c.prompt.ErrorCount();
     for (CCatalogItem* item : items)
         item->Mail(doc->GetContext());
