@@ -25,6 +25,8 @@ public:
     // "<event> was for <occasion>.", the dates and place, then the comments.
     void AppendTextLines(std::vector<std::string>& lines) const override;
     std::string GetMailText() const override;
+    // The "Event" dialog on a working copy of the fields.
+    bool Edit(CAppContext& context) override;
 
     const std::string& GetEventName() const { return m_eventName; }
     void SetEventName(const std::string& name);

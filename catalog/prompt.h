@@ -1,7 +1,10 @@
 #pragma once
 // The one interface through which program logic talks to the user: message
-// boxes now, one call per dialog as the dialogs arrive. The GUI shows real
-// windows, the command line prints, tests script the answers.
+// boxes, and one call per dialog that hands back the dialog's fields. The GUI
+// shows real windows, the command line prints, tests script the answers.
+// Every dialog call returns true for OK; the default is Cancel.
+
+#include "catalog/dialog_fields.h"
 
 #include <string>
 
@@ -20,4 +23,23 @@ public:
 
     // The program's read-me text, shown when a new catalog is created.
     virtual void ShowReadMe(const std::string& text) { (void)text; }
+
+    virtual bool SelectFolder(CSelectFolderFields& fields) { return Cancel(fields); }
+    virtual bool ChooseDocumentFiles(CDocumentFileFields& fields) { return Cancel(fields); }
+    virtual bool ManageFiles(CManageFilesFields& fields) { return Cancel(fields); }
+    virtual bool ChooseCategory(CCategoryChooserFields& fields) { return Cancel(fields); }
+    virtual bool UpdateDocumentSet(CUpdateDocumentSetFields& fields) { return Cancel(fields); }
+    virtual bool NewCategory(CNewCategoryFields& fields) { return Cancel(fields); }
+    virtual bool EditDocumentEntry(CEntryEditFields& fields) { return Cancel(fields); }
+    virtual bool EditPictureEntry(CEntryEditFields& fields) { return Cancel(fields); }
+    virtual bool EditEvent(CEventFields& fields) { return Cancel(fields); }
+    virtual bool EditRecipe(CRecipeFields& fields) { return Cancel(fields); }
+    virtual bool EditDocumentSet(CDocumentSetFields& fields) { return Cancel(fields); }
+
+private:
+    template <typename T>
+    static bool Cancel(T&)
+    {
+        return false;
+    }
 };

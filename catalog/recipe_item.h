@@ -30,6 +30,8 @@ public:
     // The recipe record, then the common item record.
     void Serialize(CArchive& ar) override;
     int GetPrintLineCount() const override { return 30; }
+    // The "Recipe" dialog; a recipe without a dish name is not taken.
+    bool Edit(CAppContext& context) override;
 
     const std::string& GetDirections() const { return m_directions; }
     void SetDirections(const std::string& text) { m_directions = text; }
