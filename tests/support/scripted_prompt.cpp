@@ -1,5 +1,19 @@
 #include "tests/support/scripted_prompt.h"
 
+namespace {
+
+template <typename Fields>
+bool Run(CScriptedPrompt::Script<Fields>& script, Fields& fields)
+{
+    if (script.empty())
+        return false;
+    const auto answer = std::move(script.front());
+    script.pop_front();
+    return answer(fields);
+}
+
+} // namespace
+
 CPrompt::Answer CScriptedPrompt::MessageBox(const std::string& text, const std::string& caption,
                                             Icon icon, Buttons buttons)
 {
@@ -19,6 +33,72 @@ CPrompt::Answer CScriptedPrompt::MessageBox(const std::string& text, const std::
         return Answer::No;
     }
     return Answer::Cancel;
+}
+
+bool CScriptedPrompt::SelectFolder(CSelectFolderFields& fields)
+{
+    dialogs.push_back("Select Folder");
+    return Run(selectFolder, fields);
+}
+
+bool CScriptedPrompt::ChooseDocumentFiles(CDocumentFileFields& fields)
+{
+    dialogs.push_back(fields.title);
+    return Run(documentFiles, fields);
+}
+
+bool CScriptedPrompt::ManageFiles(CManageFilesFields& fields)
+{
+    dialogs.push_back("Manage Files Dialog");
+    return Run(manageFiles, fields);
+}
+
+bool CScriptedPrompt::ChooseCategory(CCategoryChooserFields& fields)
+{
+    dialogs.push_back(fields.caption);
+    return Run(chooseCategory, fields);
+}
+
+bool CScriptedPrompt::UpdateDocumentSet(CUpdateDocumentSetFields& fields)
+{
+    dialogs.push_back("Update Document Set");
+    return Run(updateDocumentSet, fields);
+}
+
+bool CScriptedPrompt::NewCategory(CNewCategoryFields& fields)
+{
+    dialogs.push_back("New Category");
+    return Run(newCategory, fields);
+}
+
+bool CScriptedPrompt::EditDocumentEntry(CEntryEditFields& fields)
+{
+    dialogs.push_back("Edit Document");
+    return Run(editDocumentEntry, fields);
+}
+
+bool CScriptedPrompt::EditPictureEntry(CEntryEditFields& fields)
+{
+    dialogs.push_back("Edit Picture Entry");
+    return Run(editPictureEntry, fields);
+}
+
+bool CScriptedPrompt::EditEvent(CEventFields& fields)
+{
+    dialogs.push_back("Event");
+    return Run(editEvent, fields);
+}
+
+bool CScriptedPrompt::EditRecipe(CRecipeFields& fields)
+{
+    dialogs.push_back("Recipe");
+    return Run(editRecipe, fields);
+}
+
+bool CScriptedPrompt::EditDocumentSet(CDocumentSetFields& fields)
+{
+    dialogs.push_back("Document Sets");
+    return Run(editDocumentSet, fields);
 }
 
 CScriptedPrompt::Shown CScriptedPrompt::Only() const
