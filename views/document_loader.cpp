@@ -76,20 +76,19 @@ CDocumentItem* CDocumentLoader::FindDuplicate(const CDocumentItem& entry) const
     return CDuplicateIndex(m_env.Doc()).Find(entry);
 }
 
-std::shared_ptr<CDocumentItem> CDocumentLoader::File(const CDocumentItem& entry,
+std::shared_ptr<CDocumentItem> CDocumentLoader::File(std::shared_ptr<CDocumentItem> entry,
                                                      bool picturesOnly)
 {
     CTallowmereDoc& doc = m_env.Doc();
-    ++doc.LoadCounter();
+    entry->SetSequenceNumber(++doc.LoadCounter());
     std::shared_ptr<CDocumentItem> filed;
-    if (CAppFolders::IsPictureFile(entry.GetPathname()) == 1) {
-        auto picture = std::make_shared<CPictureItem>(entry);
-        picture->SetSequenceNumber(doc.LoadCounter());
+    if (CAppFolders::IsPictureFile(entry->GetPathname()) == 1) {
+        auto picture = std::make_shared<CPictureItem>(*entry);
         doc.AddPicture(picture);
         filed = picture;
     } else if (!picturesOnly) {
-        filed = std::make_shared<CDocumentItem>(entry);
-        filed->SetSequenceNumber(doc.LoadCounter());
+        // The entry is new and nobody else holds it: it becomes the catalog's own.
+        filed = std::move(entry);
         doc.AddDocument(filed);
     }
     if (filed)
@@ -153,7 +152,7 @@ bool CDocumentLoader::LoadDocuments(CEntryList& out, bool picturesOnly)
         CFileStatus status;
         if (!CFileStatus::GetStatus(path, status) || status.isDirectory)
             continue;
-        CDocumentItem entry(path, status);
+        auto entry = std::make_shared<CDocumentItem>(path, status);
         std::string category = target;
         const std::string relative =
             fields.createSubCategories ? RelativeCategory(selected, file.GetFolder()) : "";
@@ -162,23 +161,23 @@ bool CDocumentLoader::LoadDocuments(CEntryList& out, bool picturesOnly)
             doc.EnsureCategoryPath(category);
             m_env.MarkChanged();
         }
-        entry.SetCategoryPath(category);
-        entry.SetDocumentCategoryPath(category);
-        if (index && index->Find(entry)) {
+        entry->SetCategoryPath(category);
+        entry->SetDocumentCategoryPath(category);
+        if (index && index->Find(*entry)) {
             ++duplicates;
             continue;
         }
-        entry.SetKeyword1(fields.keyword1);
-        entry.SetKeyword2(fields.keyword2);
+        entry->SetKeyword1(fields.keyword1);
+        entry->SetKeyword2(fields.keyword2);
         if (fields.archiveMode) {
             const CFileEntry archive(doc.GetFolders().GetArchiveFolder(category),
-                                     entry.GetOriginalPathname());
+                                     entry->GetOriginalPathname());
             const std::string copy = archive.ArchiveFile(prompt, false, m_env.Now());
             if (copy.empty())
                 continue; // the user has been told; no entry without its file
-            entry.SetPathname(copy);
+            entry->SetPathname(copy);
         }
-        const std::shared_ptr<CDocumentItem> filed = File(entry, picturesOnly);
+        const std::shared_ptr<CDocumentItem> filed = File(std::move(entry), picturesOnly);
         if (!filed)
             continue;
         if (index)
@@ -254,7 +253,8 @@ bool CDocumentLoader::AddDocuments(CEntryList& out)
                                   CPrompt::Icon::Exclamation);
     }
     for (const auto& entry : entries) {
-        const std::shared_ptr<CDocumentItem> filed = File(*entry, false);
+        const std::shared_ptr<CDocumentItem> filed =
+            File(std::make_shared<CDocumentItem>(*entry), false);
         out.push_back(std::make_unique<CDocumentItem>(*filed));
     }
     return !entries.empty();

@@ -37,7 +37,7 @@ public:
 private:
     // Files one entry: registered as a picture or a document; returns the
     // catalog's item (nullptr when pictures only and it is no picture).
-    std::shared_ptr<CDocumentItem> File(const CDocumentItem& entry, bool picturesOnly);
+    std::shared_ptr<CDocumentItem> File(std::shared_ptr<CDocumentItem> entry, bool picturesOnly);
     void ReportSkipped(std::string& message) const;
 
     CCommandEnv& m_env;

@@ -79,34 +79,31 @@ CSearchFilter MakeFilter(const CFilterControls& controls, const std::string& cat
 
 void FillDocumentRows(const CTallowmereDoc& doc, const CSearchFilter& filter, CRowList& rows)
 {
-    rows.Clear();
-    std::vector<CListRow> batch;
+    rows.BeginRefill();
     for (const CItemList* list : {&doc.GetPictures(), &doc.GetDocuments()}) {
         for (const auto& item : *list) {
             if (MatchesFilter(*item, filter))
-                batch.push_back(DocumentRow(*item));
+                FillDocumentRow(*item, rows.NextRow());
         }
     }
-    rows.InsertAll(std::move(batch));
+    rows.EndRefill();
 }
 
 void FillDataItemRows(const CTallowmereDoc& doc, const std::string& kindTag,
                       const CSearchFilter& filter, CRowList& rows)
 {
-    rows.Clear();
-    std::vector<CListRow> batch;
+    rows.BeginRefill();
     for (const auto& item : ItemsOfKind(doc, kindTag)) {
         if (MatchesFilter(static_cast<const CCatalogRecord&>(*item), filter))
-            batch.push_back(DataItemRow(*item));
+            FillDataItemRow(*item, rows.NextRow());
     }
-    rows.InsertAll(std::move(batch));
+    rows.EndRefill();
 }
 
 void FillFolderRows(const std::vector<std::shared_ptr<CDocumentItem>>& items, CRowList& rows)
 {
-    rows.Clear();
-    std::vector<CListRow> batch;
+    rows.BeginRefill();
     for (const auto& item : items)
-        batch.push_back(DocumentRow(*item));
-    rows.InsertAll(std::move(batch));
+        FillDocumentRow(*item, rows.NextRow());
+    rows.EndRefill();
 }

@@ -3,6 +3,7 @@
 #include "catalog/text_util.h"
 
 #include <algorithm>
+#include <charconv>
 #include <cstdlib>
 #include <ctime>
 
@@ -25,7 +26,12 @@ bool FirstCellLess(const CListRow& a, const CListRow& b)
 
 std::string FormatSequence(int32_t number)
 {
-    return StrFormat("%9d", number);
+    char digits[16];
+    const auto result = std::to_chars(digits, digits + sizeof digits, number);
+    const size_t length = static_cast<size_t>(result.ptr - digits);
+    std::string text(length < 9 ? 9 - length : 0, ' ');
+    text.append(digits, length);
+    return text;
 }
 
 std::string FormatListDate(CTime date)
@@ -66,20 +72,40 @@ int32_t ParseSequence(const std::string& text)
     return static_cast<int32_t>(std::strtol(text.c_str(), nullptr, 10));
 }
 
+void FillDocumentRow(const CDocumentItem& item, CListRow& row)
+{
+    row.cells.resize(5);
+    row.cells[kDocNumber] = FormatSequence(item.GetSequenceNumber());
+    row.cells[kDocCaption].assign(item.GetLabel());
+    row.cells[kDocCategory].assign(item.GetCategoryPath());
+    row.cells[kDocLocation].assign(item.GetPathname());
+    row.cells[kDocCreateDate] = FormatListDate(item.GetCreateDate());
+    row.selected = false;
+}
+
+void FillDataItemRow(const CCatalogItem& item, CListRow& row)
+{
+    row.cells.resize(6);
+    row.cells[kItemName].assign(item.GetName());
+    row.cells[kItemCategory].assign(item.GetCategoryPath());
+    row.cells[kItemKeyword].assign(item.GetKeyword1());
+    row.cells[kItemType].assign(item.GetKindTag());
+    row.cells[kItemCreateDate] = FormatListDate(item.GetCreateDate());
+    row.cells[kItemSequence] = FormatSequence(item.GetSequenceNumber());
+    row.selected = false;
+}
+
 CListRow DocumentRow(const CDocumentItem& item)
 {
     CListRow row;
-    row.cells = {FormatSequence(item.GetSequenceNumber()), item.GetLabel(),
-                 item.GetCategoryPath(), item.GetPathname(), FormatListDate(item.GetCreateDate())};
+    FillDocumentRow(item, row);
     return row;
 }
 
 CListRow DataItemRow(const CCatalogItem& item)
 {
     CListRow row;
-    row.cells = {item.GetName(),    item.GetCategoryPath(),
-                 item.GetKeyword1(), item.GetKindTag(),
-                 FormatListDate(item.GetCreateDate()), FormatSequence(item.GetSequenceNumber())};
+    FillDataItemRow(item, row);
     return row;
 }
 
@@ -99,6 +125,20 @@ void CRowList::InsertAll(std::vector<CListRow> rows)
     m_rows.insert(m_rows.end(), std::make_move_iterator(rows.begin()),
                   std::make_move_iterator(rows.end()));
     std::inplace_merge(m_rows.begin(), m_rows.begin() + middle, m_rows.end(), FirstCellLess);
+}
+
+CListRow& CRowList::NextRow()
+{
+    if (m_filled == m_rows.size())
+        m_rows.emplace_back();
+    return m_rows[m_filled++];
+}
+
+void CRowList::EndRefill()
+{
+    m_rows.resize(m_filled);
+    if (!std::is_sorted(m_rows.begin(), m_rows.end(), FirstCellLess))
+        std::stable_sort(m_rows.begin(), m_rows.end(), FirstCellLess);
 }
 
 void CRowList::RemoveAt(size_t index)

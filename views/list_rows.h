@@ -32,6 +32,9 @@ int32_t ParseSequence(const std::string& text);
 
 CListRow DocumentRow(const CDocumentItem& item);
 CListRow DataItemRow(const CCatalogItem& item);
+// The same texts written into an existing row, reusing its storage.
+void FillDocumentRow(const CDocumentItem& item, CListRow& row);
+void FillDataItemRow(const CCatalogItem& item, CListRow& row);
 
 // The rows of one list, ascending by the first cell's text (byte order); a
 // row goes after the rows whose first cell equals its own.
@@ -42,6 +45,12 @@ public:
     void InsertAll(std::vector<CListRow> rows);
     void RemoveAt(size_t index);
     void Clear() { m_rows.clear(); }
+
+    // Rebuilds every row in place (a refresh): NextRow hands out the rows in
+    // turn, reusing their storage; EndRefill drops the rest and sorts.
+    void BeginRefill() { m_filled = 0; }
+    CListRow& NextRow();
+    void EndRefill();
 
     size_t size() const { return m_rows.size(); }
     bool empty() const { return m_rows.empty(); }
@@ -59,4 +68,5 @@ public:
 
 private:
     std::vector<CListRow> m_rows;
+    size_t m_filled = 0;
 };
