@@ -109,7 +109,7 @@ int RunCategory(CliContext& c)
     CCategoryCommands commands(state, cli.Env());
     if (add) {
         commands.NewCategory();
-        std::printf("Added category %s\n", state.GetCategoryBoxText().c_str());
+        std::printf("Added category %s\n", state.GetSelectedCategory().c_str());
     } else {
         commands.RemoveSelectedCategory();
     }

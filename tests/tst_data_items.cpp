@@ -215,6 +215,7 @@ void TestDataItems::newCategory()
     QCOMPARE(added.GetName(), std::string("Taxes"));
     QCOMPARE(added.GetParentPath(), selected.toStdString());
     QCOMPARE(added.GetDepth(), depth);
+    QCOMPARE(f.state.GetSelectedCategory(), selected.toStdString() + "\\Taxes");
     QCOMPARE(f.state.GetCategoryBoxText(), selected.toStdString() + "\\Taxes");
 }
 

@@ -26,7 +26,7 @@ CCategoryCommands::CCategoryCommands(CDataListState& state, CCommandEnv& env)
 void CCategoryCommands::NewCategory()
 {
     CNewCategoryFields fields;
-    fields.parentPath = m_state.GetCategoryBoxText();
+    fields.parentPath = m_state.GetSelectedCategory();
     if (!m_env.Prompt().NewCategory(fields))
         return;
     const CCategory* added = m_env.Doc().AddCategory(fields.name, fields.parentPath,
@@ -39,7 +39,7 @@ void CCategoryCommands::NewCategory()
 void CCategoryCommands::RemoveSelectedCategory()
 {
     CPrompt& prompt = m_env.Prompt();
-    const std::string path = m_state.GetCategoryBoxText();
+    const std::string path = m_state.GetSelectedCategory();
     if (prompt.MessageBox(StrFormat("Are you sure you wish to remove Category %s?", path.c_str()),
                           "Remove Category", CPrompt::Icon::Question,
                           CPrompt::Buttons::YesNo) != CPrompt::Answer::Yes)

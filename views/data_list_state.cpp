@@ -63,6 +63,7 @@ void CDataListState::SwitchSubCategories()
 
 void CDataListState::SelectCategory(const std::string& path)
 {
+    m_selectedCategory = path;
     m_categoryBox = path;
     RefreshList(path);
 }

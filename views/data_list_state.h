@@ -42,6 +42,8 @@ public:
     const std::string& GetCategoryBoxText() const { return m_categoryBox; }
     // A category chosen in the tree (or the combo box): shown and refreshed.
     void SelectCategory(const std::string& path);
+    // The category tree's selected category, which the category commands act on.
+    const std::string& GetSelectedCategory() const { return m_selectedCategory; }
     // The roots of the current tab's category tree ("" in tab 0).
     std::vector<std::string> TreeRoots() const;
     // Rebuilds the tree for the tab's root and selects the root.
@@ -87,6 +89,7 @@ private:
     CRowList m_recipes;
     CFilterControls m_filter;
     std::string m_categoryBox;
+    std::string m_selectedCategory;
     std::string m_folder;
     std::vector<std::shared_ptr<CDocumentItem>> m_folderItems;
 };
