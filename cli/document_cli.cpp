@@ -8,8 +8,7 @@
 
 CDocumentCli::CDocumentCli(CliContext& context, CPrompt::Answer questions)
     : m_context(context), m_answers(questions)
-{
-}
+{}
 
 bool CDocumentCli::Open()
 {
@@ -49,8 +48,7 @@ std::shared_ptr<CDocumentItem> CDocumentCli::FindEntry(int32_t sequence) const
     return nullptr;
 }
 
-bool CDocumentCli::ParseSequences(int first, std::vector<int32_t>& sequences,
-                                  int& exitCode) const
+bool CDocumentCli::ParseSequences(int first, std::vector<int32_t>& sequences, int& exitCode) const
 {
     for (int i = first; i < m_context.arguments.size(); ++i) {
         bool ok = false;

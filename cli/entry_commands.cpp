@@ -51,7 +51,8 @@ int RunRemove(CliContext& c)
     CEntryOps ops(cli.Env());
     for (const auto& entry : entries) {
         if (ops.RemoveEntry(*entry))
-            std::printf("Removed %d %s\n", entry->GetSequenceNumber(), entry->GetPathname().c_str());
+            std::printf("Removed %d %s\n", entry->GetSequenceNumber(),
+                        entry->GetPathname().c_str());
     }
     return cli.Finish();
 }
@@ -69,8 +70,8 @@ int RunMove(CliContext& c)
         return kExitCatalog;
     const std::string category = c.parser.value(QStringLiteral("category")).toStdString();
     if (!cli.CategoryExists(category))
-        return c.Failure(QStringLiteral("there is no category %1")
-                             .arg(QString::fromStdString(category)));
+        return c.Failure(
+            QStringLiteral("there is no category %1").arg(QString::fromStdString(category)));
     std::vector<std::unique_ptr<CDocumentItem>> entries;
     if (!EntriesOf(c, cli, sequences, entries, exitCode))
         return exitCode;
@@ -149,9 +150,8 @@ int RunSet(CliContext& c)
     if (create) {
         if (ops.CreateDocumentSet(Pointers(entries))) {
             const auto& set = cli.Doc().GetDocumentSets().back();
-            std::printf("Created document set %d %s with %zu documents\n",
-                        set->GetSequenceNumber(), set->GetLabel().c_str(),
-                        set->GetMembers().size());
+            std::printf("Created document set %d %s with %zu documents\n", set->GetSequenceNumber(),
+                        set->GetLabel().c_str(), set->GetMembers().size());
         }
     } else if (ops.AddToDocumentSet(Pointers(entries))) {
         std::printf("Added %zu documents to document set %d\n", entries.size(),

@@ -179,8 +179,8 @@ int RunList(CliContext& c)
             return c.Usage(QStringLiteral("--%1 takes seconds since 1970 or an ISO date")
                                .arg(QString::fromLatin1(bound)));
     }
-    filter.filterOn = IsSet(c, "keyword1") || IsSet(c, "keyword2") || IsSet(c, "from") ||
-                      IsSet(c, "to");
+    filter.filterOn =
+        IsSet(c, "keyword1") || IsSet(c, "keyword2") || IsSet(c, "from") || IsSet(c, "to");
     if (tab == TabKind::Documents)
         state.SetCurrentFolder(AbsolutePath(c.parser.value(QStringLiteral("folder"))));
     state.SetTab(tab);
@@ -191,17 +191,16 @@ int RunList(CliContext& c)
     return kExitOk;
 }
 
-const CliRegistration kLoad{
-    {QStringLiteral("load"), QStringLiteral("FOLDER"),
-     QStringLiteral("Load every file below a folder into the catalog."), AddLoadOptions, RunLoad}};
+const CliRegistration kLoad{{QStringLiteral("load"), QStringLiteral("FOLDER"),
+                             QStringLiteral("Load every file below a folder into the catalog."),
+                             AddLoadOptions, RunLoad}};
 
 const CliRegistration kAdd{
     {QStringLiteral("add"), QStringLiteral("FILE..."),
      QStringLiteral("Add files to the catalog; prints their rows."),
      [](QCommandLineParser& p) {
          p.addOptions({Option("category", "Category to file under (default DOCUMENTS).", "PATH"),
-                       Option("caption", "Caption of the new entries (23 bytes at most).",
-                              "TEXT"),
+                       Option("caption", "Caption of the new entries (23 bytes at most).", "TEXT"),
                        Option("archive", "Copy the files into the archive.")});
      },
      RunAdd}};

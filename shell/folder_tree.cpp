@@ -15,8 +15,7 @@ std::string Join(const std::string& folder, const std::string& name)
 
 // Calls visit(name) for each folder in path (links to folders count) until it
 // returns false.
-template <typename Visit>
-void ForEachFolder(const std::string& path, Visit visit)
+template <typename Visit> void ForEachFolder(const std::string& path, Visit visit)
 {
     DIR* dir = ::opendir(path.c_str());
     if (!dir)
@@ -38,9 +37,7 @@ void ForEachFolder(const std::string& path, Visit visit)
 
 } // namespace
 
-CFolderTree::CFolderTree(CFolderTreeSink& sink, CPrompt& prompt) : m_sink(sink), m_prompt(prompt)
-{
-}
+CFolderTree::CFolderTree(CFolderTreeSink& sink, CPrompt& prompt) : m_sink(sink), m_prompt(prompt) {}
 
 int CFolderTree::AddDrives(const std::vector<CVolume>& volumes)
 {
@@ -66,8 +63,9 @@ bool CFolderTree::AddDriveItem(const CVolume& volume)
         image = kImageCdRom;
         break;
     default:
-        m_prompt.MessageBox(StrFormat("Unknown drive item of type %d", static_cast<int>(volume.type)),
-                            "Add drive item", CPrompt::Icon::Information);
+        m_prompt.MessageBox(
+            StrFormat("Unknown drive item of type %d", static_cast<int>(volume.type)),
+            "Add drive item", CPrompt::Icon::Information);
         return false;
     }
     const auto item = m_sink.InsertItem(0, volume.ItemText(), volume.rootPath, image, false);

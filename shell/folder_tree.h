@@ -32,8 +32,14 @@ public:
 class CFolderTree
 {
 public:
-    enum Image { kImageDrive = 0, kImageCdRom = 2, kImageFolder = 4, kImageOpenFolder = 5,
-                 kImagePlaceholder = 6 };
+    enum Image
+    {
+        kImageDrive = 0,
+        kImageCdRom = 2,
+        kImageFolder = 4,
+        kImageOpenFolder = 5,
+        kImagePlaceholder = 6
+    };
     static constexpr const char* kPlaceholderText = "dummy";
 
     CFolderTree(CFolderTreeSink& sink, CPrompt& prompt);

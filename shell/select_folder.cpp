@@ -2,8 +2,7 @@
 
 CSelectFolderLogic::CSelectFolderLogic(CSelectFolderFields& fields, VolumeType volumeType)
     : m_fields(fields), m_volumeType(std::move(volumeType))
-{
-}
+{}
 
 void CSelectFolderLogic::Open()
 {

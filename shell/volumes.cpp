@@ -31,10 +31,10 @@ std::string CVolume::ItemText() const
 bool IsPseudoFileSystem(const std::string& fileSystem)
 {
     static const std::set<std::string> kPseudo = {
-        "autofs", "binfmt_misc", "bpf",     "cgroup",   "cgroup2",    "configfs",
-        "debugfs", "devpts",     "devtmpfs", "efivarfs", "fusectl",    "hugetlbfs",
-        "mqueue", "nsfs",        "proc",    "pstore",   "rpc_pipefs", "securityfs",
-        "sysfs",  "tracefs",     "fuse.portal", "fuse.gvfsd-fuse", "squashfs"};
+        "autofs",  "binfmt_misc", "bpf",         "cgroup",          "cgroup2",    "configfs",
+        "debugfs", "devpts",      "devtmpfs",    "efivarfs",        "fusectl",    "hugetlbfs",
+        "mqueue",  "nsfs",        "proc",        "pstore",          "rpc_pipefs", "securityfs",
+        "sysfs",   "tracefs",     "fuse.portal", "fuse.gvfsd-fuse", "squashfs"};
     return kPseudo.count(fileSystem) > 0;
 }
 
@@ -42,9 +42,9 @@ DriveType ClassifyVolume(const std::string& fileSystem, const std::string& mount
                          bool removableDevice)
 {
     static const std::set<std::string> kRemote = {
-        "nfs",        "nfs4",       "cifs",        "smb3",       "smbfs",      "sshfs",
-        "fuse.sshfs", "fuse.rclone", "fuse.s3fs",  "davfs",      "fuse.davfs2", "afs",
-        "ceph",       "glusterfs",  "fuse.glusterfs", "9p",      "ncpfs",      "fuse.curlftpfs"};
+        "nfs",        "nfs4",        "cifs",           "smb3",  "smbfs",       "sshfs",
+        "fuse.sshfs", "fuse.rclone", "fuse.s3fs",      "davfs", "fuse.davfs2", "afs",
+        "ceph",       "glusterfs",   "fuse.glusterfs", "9p",    "ncpfs",       "fuse.curlftpfs"};
     if (fileSystem == "iso9660" || fileSystem == "udf")
         return DriveType::CdRom;
     if (kRemote.count(fileSystem))

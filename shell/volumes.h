@@ -6,7 +6,8 @@
 #include <vector>
 
 // The numbers of the drive types the tree and the folder dialog act on.
-enum class DriveType : int {
+enum class DriveType : int
+{
     Unknown = 0,
     Removable = 2,
     Fixed = 3,

@@ -82,13 +82,13 @@ void TestCliDocuments::loadListMoveRemove()
     const QString a = cli.Path("src/a.txt");
     const QString b = cli.Path("src/2002/b.png");
     run = cli({"list", "managed", "--subcategories"});
-    QCOMPARE(Rows(run.out), (QStringList{"        1|b|DOCUMENTS\\2002|" + b,
-                                         "        2|a|DOCUMENTS|" + a}));
+    QCOMPARE(Rows(run.out),
+             (QStringList{"        1|b|DOCUMENTS\\2002|" + b, "        2|a|DOCUMENTS|" + a}));
     QCOMPARE(Rows(cli({"list", "managed"}).out), QStringList{"        2|a|DOCUMENTS|" + a});
-    QCOMPARE(Rows(cli({"list", "managed", "--subcategories", "--keyword1", "tax", "--to",
-                       "2001-01-01"})
-                      .out),
-             QStringList());
+    QCOMPARE(
+        Rows(cli({"list", "managed", "--subcategories", "--keyword1", "tax", "--to", "2001-01-01"})
+                 .out),
+        QStringList());
     QCOMPARE(Rows(cli({"list", "managed", "--category", "DOCUMENTS\\2002"}).out).size(), 1);
     QCOMPARE(Rows(cli({"list", "documents", "--folder", cli.Path("src")}).out),
              QStringList{"        1|a|<File System>|" + a});
@@ -115,10 +115,9 @@ void TestCliDocuments::addCategoryAndSets()
     run = cli({"add", cli.Path("src/a.txt"), cli.Path("src/c.JPG"), "--category",
                "DOCUMENTS\\Taxes", "--caption", "Return"});
     QCOMPARE(run.code, 0);
-    QCOMPARE(Rows(run.out), (QStringList{"        1|Return|DOCUMENTS\\Taxes|" +
-                                             cli.Path("src/a.txt"),
-                                         "        2|Return|DOCUMENTS\\Taxes|" +
-                                             cli.Path("src/c.JPG")}));
+    QCOMPARE(Rows(run.out),
+             (QStringList{"        1|Return|DOCUMENTS\\Taxes|" + cli.Path("src/a.txt"),
+                          "        2|Return|DOCUMENTS\\Taxes|" + cli.Path("src/c.JPG")}));
 
     run = cli({"set", "create", "Taxes 2003", "1", "2"});
     QCOMPARE(run.code, 0);

@@ -68,8 +68,11 @@ void TestDataItems::addEventShowsRow()
     QCOMPARE(event.GetAttendees().size(), size_t(2));
     const CRowList& rows = f.state.Rows(TabKind::Events);
     QCOMPARE(rows.size(), size_t(1));
-    const std::vector<std::string> cells = {"Ann's birthday", "EVENTS\\Birthdays", "cake",
-                                            "EVENT", FormatListDate(event.GetCreateDate()),
+    const std::vector<std::string> cells = {"Ann's birthday",
+                                            "EVENTS\\Birthdays",
+                                            "cake",
+                                            "EVENT",
+                                            FormatListDate(event.GetCreateDate()),
                                             "        1"};
     QCOMPARE(rows.at(0).cells, cells);
     QVERIFY(f.env.Changed());
@@ -227,10 +230,10 @@ void TestDataItems::removeCategory_data()
     QTest::addColumn<int>("removed");
     QTest::newRow("root") << "RECIPES" << true << "Unable to remove root Category RECIPES!" << 0;
     QTest::newRow("answer no") << "RECIPES\\Entrees" << false << "" << 0;
-    QTest::newRow("only the record") << "RECIPES\\Entrees" << true
-                                     << "Category RECIPES\\Entrees has been removed!" << 1;
-    QTest::newRow("no such record") << "RECIPES\\Nothing" << true
-                                    << "Category RECIPES\\Nothing has been removed!" << 0;
+    QTest::newRow("only the record")
+        << "RECIPES\\Entrees" << true << "Category RECIPES\\Entrees has been removed!" << 1;
+    QTest::newRow("no such record")
+        << "RECIPES\\Nothing" << true << "Category RECIPES\\Nothing has been removed!" << 0;
 }
 
 void TestDataItems::removeCategory()

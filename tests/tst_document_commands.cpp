@@ -3,8 +3,8 @@
 
 #include "tests/support/command_fixture.h"
 #include "views/data_list_state.h"
-#include "views/list_commands.h"
 #include "views/entry_ops.h"
+#include "views/list_commands.h"
 #include "views/services.h"
 
 #include <QFile>
@@ -41,7 +41,10 @@ struct Fixture : CCommandFixture
         prompt.shown.clear();
         state.SwitchSubCategories();
     }
-    bool Exists(const std::string& path) const { return QFile::exists(QString::fromStdString(path)); }
+    bool Exists(const std::string& path) const
+    {
+        return QFile::exists(QString::fromStdString(path));
+    }
 
     CDataListState state;
     CListCommands commands;
@@ -75,27 +78,26 @@ void TestDocumentCommands::refusals_data()
     QTest::addColumn<QString>("caption");
 
     const QString none = QStringLiteral("No item has been selected!");
-    QTest::newRow("load in Documents") << 0 << int(kCmdLoad)
-                                       << "Unable to load documents from this tab!"
-                                       << "Load Document(s)";
-    QTest::newRow("delete in Documents") << 0 << int(kCmdDelete)
-                                         << "Unable to delete documents from this tab!"
-                                         << "Delete Document(s)";
-    QTest::newRow("edit in Documents") << 0 << int(kCmdEdit)
-                                       << "Unable to move documents from this tab!"
-                                       << "Edit Document(s)";
-    QTest::newRow("move in Documents") << 0 << int(kCmdMove)
-                                       << "Unable to load documents from this tab!"
-                                       << "Load Document(s)";
-    QTest::newRow("mail in Documents, none selected") << 0 << int(kCmdMail) << none
-                                                      << "Selected Document";
-    QTest::newRow("delete, none selected") << 1 << int(kCmdDelete) << none
-                                           << "Delete Document(s)";
+    QTest::newRow("load in Documents")
+        << 0 << int(kCmdLoad) << "Unable to load documents from this tab!"
+        << "Load Document(s)";
+    QTest::newRow("delete in Documents")
+        << 0 << int(kCmdDelete) << "Unable to delete documents from this tab!"
+        << "Delete Document(s)";
+    QTest::newRow("edit in Documents")
+        << 0 << int(kCmdEdit) << "Unable to move documents from this tab!"
+        << "Edit Document(s)";
+    QTest::newRow("move in Documents")
+        << 0 << int(kCmdMove) << "Unable to load documents from this tab!"
+        << "Load Document(s)";
+    QTest::newRow("mail in Documents, none selected")
+        << 0 << int(kCmdMail) << none << "Selected Document";
+    QTest::newRow("delete, none selected") << 1 << int(kCmdDelete) << none << "Delete Document(s)";
     QTest::newRow("edit, none selected") << 1 << int(kCmdEdit) << none << "Edit Document(s)";
     QTest::newRow("mail, none selected") << 1 << int(kCmdMail) << none << "Selected Document";
     QTest::newRow("move, none selected") << 1 << int(kCmdMove) << none << "Selected Document";
-    QTest::newRow("add to set, none selected") << 1 << int(kCmdAddToSet) << none
-                                               << "Selected Document";
+    QTest::newRow("add to set, none selected")
+        << 1 << int(kCmdAddToSet) << none << "Selected Document";
 }
 
 void TestDocumentCommands::refusals()
@@ -198,8 +200,8 @@ void TestDocumentCommands::moveArchivedFileAlong()
     QCOMPARE(shown.roots, std::vector<std::string>{"DOCUMENTS"});
     const auto& moved = f.doc.GetDocuments().at(0);
     const auto& kept = f.doc.GetDocuments().at(1);
-    const std::string expected = f.ArchiveRoot() + "/DOCUMENTS/Taxes/a-" +
-                                 CCommandFixture::kStamp + "-2.txt";
+    const std::string expected =
+        f.ArchiveRoot() + "/DOCUMENTS/Taxes/a-" + CCommandFixture::kStamp + "-2.txt";
     QCOMPARE(moved->GetCategoryPath(), std::string("DOCUMENTS\\Taxes"));
     QCOMPARE(moved->GetDocumentCategoryPath(), std::string("DOCUMENTS\\Taxes"));
     QCOMPARE(moved->GetPathname(), expected);

@@ -72,8 +72,10 @@ void TestDocumentLoad::loadTwiceWithUniqueCheck()
     f.ScriptLoad(f.Root() + "/src", true);
     QVERIFY(loader.LoadDocuments(out, false));
     QCOMPARE(f.prompt.shown.size(), size_t(2));
-    QCOMPARE(f.prompt.shown[0].text, std::string("Loaded 3 documents, found 0 duplicate documents."));
-    QCOMPARE(f.prompt.shown[1].text, std::string("Loaded 0 documents, found 3 duplicate documents."));
+    QCOMPARE(f.prompt.shown[0].text,
+             std::string("Loaded 3 documents, found 0 duplicate documents."));
+    QCOMPARE(f.prompt.shown[1].text,
+             std::string("Loaded 0 documents, found 3 duplicate documents."));
     QCOMPARE(f.prompt.shown[1].caption, std::string("Load Document(s)"));
     QCOMPARE(f.prompt.shown[1].icon, CPrompt::Icon::Information);
     QCOMPARE(f.doc.GetDocuments().size(), size_t(3));
@@ -189,7 +191,8 @@ void TestDocumentLoad::lineBreakPathsSkipped()
     CDocumentLoader(f.env).LoadDocuments(out, false);
     QCOMPARE(f.prompt.Only().text,
              "Successfully loaded 1 documents.\nSkipped 1 file(s) whose name holds a line "
-             "break:\n" + f.Root() + "/src/bad\\nname.txt");
+             "break:\n" +
+                 f.Root() + "/src/bad\\nname.txt");
     QCOMPARE(f.doc.GetDocuments().size(), size_t(1));
 
     CScriptedPrompt& prompt = f.prompt;
@@ -273,21 +276,39 @@ void TestDocumentLoad::duplicateRule_data()
     QTest::addColumn<QString>("differs");  // what the new entry changes
     QTest::addColumn<bool>("duplicate");
 
-    QTest::newRow("same document") << "a.txt" << "ns" << "" << true;
-    QTest::newRow("document in another category") << "a.txt" << "ns" << "category" << false;
-    QTest::newRow("document, other modify date") << "a.txt" << "ns" << "modify" << false;
-    QTest::newRow("document, other create date") << "a.txt" << "" << "create" << false;
-    QTest::newRow("picture, name and size, other create date") << "a.jpg" << "ns" << "create"
-                                                               << true;
-    QTest::newRow("picture, name and size, other size") << "a.jpg" << "ns" << "size" << false;
-    QTest::newRow("picture, modify only, other create date") << "a.jpg" << "m" << "create"
-                                                             << true;
-    QTest::newRow("picture, create only, other modify date") << "a.jpg" << "c" << "modify"
-                                                             << true;
-    QTest::newRow("picture, create only, other create date") << "a.jpg" << "c" << "create"
-                                                             << false;
-    QTest::newRow("picture in another category") << "a.jpg" << "" << "category" << false;
-    QTest::newRow("picture, name, other file") << "a.JPG" << "n" << "name" << false;
+    QTest::newRow("same document") << "a.txt"
+                                   << "ns"
+                                   << "" << true;
+    QTest::newRow("document in another category") << "a.txt"
+                                                  << "ns"
+                                                  << "category" << false;
+    QTest::newRow("document, other modify date") << "a.txt"
+                                                 << "ns"
+                                                 << "modify" << false;
+    QTest::newRow("document, other create date") << "a.txt"
+                                                 << ""
+                                                 << "create" << false;
+    QTest::newRow("picture, name and size, other create date") << "a.jpg"
+                                                               << "ns"
+                                                               << "create" << true;
+    QTest::newRow("picture, name and size, other size") << "a.jpg"
+                                                        << "ns"
+                                                        << "size" << false;
+    QTest::newRow("picture, modify only, other create date") << "a.jpg"
+                                                             << "m"
+                                                             << "create" << true;
+    QTest::newRow("picture, create only, other modify date") << "a.jpg"
+                                                             << "c"
+                                                             << "modify" << true;
+    QTest::newRow("picture, create only, other create date") << "a.jpg"
+                                                             << "c"
+                                                             << "create" << false;
+    QTest::newRow("picture in another category") << "a.jpg"
+                                                 << ""
+                                                 << "category" << false;
+    QTest::newRow("picture, name, other file") << "a.JPG"
+                                               << "n"
+                                               << "name" << false;
 }
 
 void TestDocumentLoad::duplicateRule()

@@ -105,21 +105,28 @@ void TestFolderTree::classify_data()
     QTest::addColumn<QString>("mountPoint");
     QTest::addColumn<bool>("removableDevice");
     QTest::addColumn<int>("type");
-    QTest::newRow("disk") << "ext4" << "/" << false << int(DriveType::Fixed);
-    QTest::newRow("usb stick flag") << "vfat" << "/mnt/stick" << true << int(DriveType::Removable);
-    QTest::newRow("under /media") << "vfat" << "/media/ann/CAMERA" << false
-                                  << int(DriveType::Removable);
-    QTest::newRow("under /run/media") << "exfat" << "/run/media/ann/X" << false
-                                      << int(DriveType::Removable);
-    QTest::newRow("not /mediaserver") << "ext4" << "/mediaserver" << false
-                                      << int(DriveType::Fixed);
-    QTest::newRow("dvd") << "iso9660" << "/media/cdrom" << true << int(DriveType::CdRom);
-    QTest::newRow("blu-ray") << "udf" << "/media/bd" << false << int(DriveType::CdRom);
-    QTest::newRow("nfs") << "nfs4" << "/net/home" << false << int(DriveType::Remote);
-    QTest::newRow("samba") << "cifs" << "/mnt/share" << false << int(DriveType::Remote);
-    QTest::newRow("sshfs") << "fuse.sshfs" << "/home/ann/remote" << false
-                           << int(DriveType::Remote);
-    QTest::newRow("tmpfs") << "tmpfs" << "/tmp" << false << int(DriveType::RamDisk);
+    QTest::newRow("disk") << "ext4"
+                          << "/" << false << int(DriveType::Fixed);
+    QTest::newRow("usb stick flag") << "vfat"
+                                    << "/mnt/stick" << true << int(DriveType::Removable);
+    QTest::newRow("under /media") << "vfat"
+                                  << "/media/ann/CAMERA" << false << int(DriveType::Removable);
+    QTest::newRow("under /run/media") << "exfat"
+                                      << "/run/media/ann/X" << false << int(DriveType::Removable);
+    QTest::newRow("not /mediaserver") << "ext4"
+                                      << "/mediaserver" << false << int(DriveType::Fixed);
+    QTest::newRow("dvd") << "iso9660"
+                         << "/media/cdrom" << true << int(DriveType::CdRom);
+    QTest::newRow("blu-ray") << "udf"
+                             << "/media/bd" << false << int(DriveType::CdRom);
+    QTest::newRow("nfs") << "nfs4"
+                         << "/net/home" << false << int(DriveType::Remote);
+    QTest::newRow("samba") << "cifs"
+                           << "/mnt/share" << false << int(DriveType::Remote);
+    QTest::newRow("sshfs") << "fuse.sshfs"
+                           << "/home/ann/remote" << false << int(DriveType::Remote);
+    QTest::newRow("tmpfs") << "tmpfs"
+                           << "/tmp" << false << int(DriveType::RamDisk);
 }
 
 void TestFolderTree::classify()
@@ -128,9 +135,9 @@ void TestFolderTree::classify()
     QFETCH(QString, mountPoint);
     QFETCH(bool, removableDevice);
     QFETCH(int, type);
-    QCOMPARE(int(ClassifyVolume(fileSystem.toStdString(), mountPoint.toStdString(),
-                                removableDevice)),
-             type);
+    QCOMPARE(
+        int(ClassifyVolume(fileSystem.toStdString(), mountPoint.toStdString(), removableDevice)),
+        type);
 }
 
 void TestFolderTree::volumeOfPath()
@@ -231,10 +238,9 @@ void TestFolderTree::selectFolderArchiveMode()
     QFETCH(QString, path);
     QFETCH(bool, archive);
     QFETCH(bool, fixed);
-    const std::vector<CVolume> mounted = {Volume("/", DriveType::Fixed),
-                                          Volume("/media/ann/CAM", DriveType::Removable),
-                                          Volume("/net/share", DriveType::Remote),
-                                          Volume("/tmp", DriveType::RamDisk)};
+    const std::vector<CVolume> mounted = {
+        Volume("/", DriveType::Fixed), Volume("/media/ann/CAM", DriveType::Removable),
+        Volume("/net/share", DriveType::Remote), Volume("/tmp", DriveType::RamDisk)};
     CSelectFolderFields fields;
     fields.archiveFixed = false;
     fields.archiveRemovable = true;

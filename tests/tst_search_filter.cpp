@@ -49,38 +49,56 @@ void TestSearchFilter::matches_data()
     const QString letter = QStringLiteral("DOCUMENTS\\Letter");
     const qint64 mid = kMar05 + kDay; // from kMar05 to kMar05 + 2 days below
     QTest::newRow("keyword 1 found in keyword 2")
-        << letters << "" << "tax" << mid << letters << false << true << "tax" << "" << true;
+        << letters << ""
+        << "tax" << mid << letters << false << true << "tax"
+        << "" << true;
     QTest::newRow("keyword is whole, not a prefix")
-        << letters << "taxes" << "" << mid << letters << false << true << "tax" << "" << false;
-    QTest::newRow("keyword case counts")
-        << letters << "Tax" << "" << mid << letters << false << true << "tax" << "" << false;
+        << letters << "taxes"
+        << "" << mid << letters << false << true << "tax"
+        << "" << false;
+    QTest::newRow("keyword case counts") << letters << "Tax"
+                                         << "" << mid << letters << false << true << "tax"
+                                         << "" << false;
     QTest::newRow("both keywords, either field")
-        << letters << "2003" << "tax" << mid << letters << false << true << "tax" << "2003"
-        << true;
+        << letters << "2003"
+        << "tax" << mid << letters << false << true << "tax"
+        << "2003" << true;
     QTest::newRow("both keywords, one missing")
-        << letters << "tax" << "other" << mid << letters << false << true << "tax" << "2003"
-        << false;
+        << letters << "tax"
+        << "other" << mid << letters << false << true << "tax"
+        << "2003" << false;
     QTest::newRow("sub-categories by character prefix")
-        << letters << "" << "" << mid << letter << true << false << "" << "" << true;
+        << letters << ""
+        << "" << mid << letter << true << false << ""
+        << "" << true;
     QTest::newRow("without sub-categories the path must be equal")
-        << letters << "" << "" << mid << letter << false << false << "" << "" << false;
-    QTest::newRow("category case counts")
-        << letters << "" << "" << mid << "documents" << true << false << "" << "" << false;
+        << letters << ""
+        << "" << mid << letter << false << false << ""
+        << "" << false;
+    QTest::newRow("category case counts") << letters << ""
+                                          << "" << mid << "documents" << true << false << ""
+                                          << "" << false;
     QTest::newRow("filter off ignores keywords and dates")
-        << letters << "x" << "y" << qint64(0) << letters << false << false << "tax" << "z"
-        << true;
+        << letters << "x"
+        << "y" << qint64(0) << letters << false << false << "tax"
+        << "z" << true;
     QTest::newRow("filter off still tests the category")
-        << "RECIPES" << "" << "" << mid << letters << true << false << "" << "" << false;
-    QTest::newRow("from date included")
-        << letters << "" << "" << kMar05 << letters << false << true << "" << "" << true;
-    QTest::newRow("before from date")
-        << letters << "" << "" << kMar05 - 1 << letters << false << true << "" << "" << false;
-    QTest::newRow("to date included")
-        << letters << "" << "" << kMar05 + 2 * kDay << letters << false << true << "" << ""
-        << true;
-    QTest::newRow("after to date")
-        << letters << "" << "" << kMar05 + 2 * kDay + 1 << letters << false << true << "" << ""
-        << false;
+        << "RECIPES"
+        << ""
+        << "" << mid << letters << true << false << ""
+        << "" << false;
+    QTest::newRow("from date included") << letters << ""
+                                        << "" << kMar05 << letters << false << true << ""
+                                        << "" << true;
+    QTest::newRow("before from date") << letters << ""
+                                      << "" << kMar05 - 1 << letters << false << true << ""
+                                      << "" << false;
+    QTest::newRow("to date included") << letters << ""
+                                      << "" << kMar05 + 2 * kDay << letters << false << true << ""
+                                      << "" << true;
+    QTest::newRow("after to date") << letters << ""
+                                   << "" << kMar05 + 2 * kDay + 1 << letters << false << true << ""
+                                   << "" << false;
 }
 
 void TestSearchFilter::matches()
@@ -203,8 +221,7 @@ void TestSearchFilter::itemsOfKindNames()
     QCOMPARE(ItemsOfKind(f.doc, "EVENT").at(0)->GetName(), std::string("Ann's birthday"));
     QCOMPARE(ItemsOfKind(f.doc, "DOCUMENT SETS").at(0)->GetName(), std::string("Taxes 2003"));
     QCOMPARE(ItemsOfKind(f.doc, "").at(0)->GetName(), std::string("Stew"));
-    QCOMPARE(ItemsOfKind(f.doc, "DOCUMENT SETS").at(0)->GetKindTag(),
-             std::string("DOCUMENT SETS"));
+    QCOMPARE(ItemsOfKind(f.doc, "DOCUMENT SETS").at(0)->GetKindTag(), std::string("DOCUMENT SETS"));
 }
 
 QTEST_GUILESS_MAIN(TestSearchFilter)

@@ -20,8 +20,7 @@ int32_t LevelOf(const std::string& path)
 
 CCategoryCommands::CCategoryCommands(CDataListState& state, CCommandEnv& env)
     : m_state(state), m_env(env)
-{
-}
+{}
 
 void CCategoryCommands::NewCategory()
 {
@@ -29,8 +28,8 @@ void CCategoryCommands::NewCategory()
     fields.parentPath = m_state.GetSelectedCategory();
     if (!m_env.Prompt().NewCategory(fields))
         return;
-    const CCategory* added = m_env.Doc().AddCategory(fields.name, fields.parentPath,
-                                                     LevelOf(fields.parentPath));
+    const CCategory* added =
+        m_env.Doc().AddCategory(fields.name, fields.parentPath, LevelOf(fields.parentPath));
     m_env.MarkChanged();
     m_state.Notify(CDataListState::Change::CategoryTree);
     m_state.SelectCategory(added->GetPath());

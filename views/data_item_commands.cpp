@@ -8,8 +8,7 @@
 
 CDataItemCommands::CDataItemCommands(CDataListState& state, CCommandEnv& env)
     : m_state(state), m_env(env), m_items(env), m_categories(state, env)
-{
-}
+{}
 
 bool CDataItemCommands::NothingSelected(const std::vector<std::unique_ptr<CCatalogItem>>& items,
                                         const char* caption) const
@@ -20,8 +19,8 @@ bool CDataItemCommands::NothingSelected(const std::vector<std::unique_ptr<CCatal
     return true;
 }
 
-std::vector<CCatalogItem*> CDataItemCommands::CatalogItems(
-    const std::vector<std::unique_ptr<CCatalogItem>>& selected) const
+std::vector<CCatalogItem*>
+CDataItemCommands::CatalogItems(const std::vector<std::unique_ptr<CCatalogItem>>& selected) const
 {
     std::vector<CCatalogItem*> items;
     for (const auto& row : selected) {
@@ -172,8 +171,8 @@ void CDataItemCommands::Mail()
         CMailService* mail = m_env.Mail();
         if (!mail || !mail->IsAvailable()) {
             m_env.Prompt().MessageBox(
-                "Error! The mail system is not available - could not find xdg-email",
-                "Send Mail", CPrompt::Icon::Stop);
+                "Error! The mail system is not available - could not find xdg-email", "Send Mail",
+                CPrompt::Icon::Stop);
             continue;
         }
         item->Mail(m_env.Doc().GetContext());

@@ -22,8 +22,8 @@ public:
 private:
     bool NothingSelected(const std::vector<std::unique_ptr<CCatalogItem>>& items,
                          const char* caption) const;
-    std::vector<CCatalogItem*> CatalogItems(
-        const std::vector<std::unique_ptr<CCatalogItem>>& selected) const;
+    std::vector<CCatalogItem*>
+    CatalogItems(const std::vector<std::unique_ptr<CCatalogItem>>& selected) const;
     void Add();
     void Delete();
     void Edit();

@@ -18,8 +18,7 @@ Item* FindIn(const std::vector<std::unique_ptr<Item>>& list, int32_t sequence)
     return nullptr;
 }
 
-template <typename Item>
-bool RemoveFrom(std::vector<std::unique_ptr<Item>>& list, int32_t sequence)
+template <typename Item> bool RemoveFrom(std::vector<std::unique_ptr<Item>>& list, int32_t sequence)
 {
     const auto it = std::find_if(list.begin(), list.end(), [sequence](const auto& item) {
         return item->GetSequenceNumber() == sequence;

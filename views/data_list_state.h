@@ -15,7 +15,13 @@ class CTallowmereDoc;
 class CDataListState
 {
 public:
-    enum class Change { Rows, CategoryTree, PreviewPane, Tab };
+    enum class Change
+    {
+        Rows,
+        CategoryTree,
+        PreviewPane,
+        Tab
+    };
 
     explicit CDataListState(CTallowmereDoc& doc);
 

@@ -20,8 +20,7 @@ std::vector<const CDocumentItem*> Pointers(const std::vector<std::unique_ptr<CDo
 CDocumentCommands::CDocumentCommands(CDataListState& state, CCommandEnv& env)
     : m_state(state), m_env(env), m_loader(env), m_entries(env), m_items(env),
       m_categories(state, env)
-{
-}
+{}
 
 void CDocumentCommands::Refuse(const char* text, const char* caption) const
 {

@@ -249,8 +249,7 @@ bool CDocumentLoader::AddDocuments(CEntryList& out)
     if (!m_skipped.empty()) {
         std::string message;
         ReportSkipped(message);
-        m_env.Prompt().MessageBox(message.substr(1), "Add Document(s)",
-                                  CPrompt::Icon::Exclamation);
+        m_env.Prompt().MessageBox(message.substr(1), "Add Document(s)", CPrompt::Icon::Exclamation);
     }
     for (const auto& entry : entries) {
         const std::shared_ptr<CDocumentItem> filed =

@@ -14,8 +14,7 @@ void AppendField(std::string& key, const std::string& text)
     key += text;
 }
 
-template <typename T>
-void AppendValue(std::string& key, T value)
+template <typename T> void AppendValue(std::string& key, T value)
 {
     char bytes[sizeof value];
     std::memcpy(bytes, &value, sizeof value);

@@ -64,8 +64,8 @@ CEntryOps::CEntryOps(CCommandEnv& env) : m_env(env) {}
 std::shared_ptr<CDocumentItem> CEntryOps::FindEntry(const CDocumentItem& item) const
 {
     CTallowmereDoc& doc = m_env.Doc();
-    const CItemList& list = IsPicturePath(item.GetPathname()) ? doc.GetPictures()
-                                                              : doc.GetDocuments();
+    const CItemList& list =
+        IsPicturePath(item.GetPathname()) ? doc.GetPictures() : doc.GetDocuments();
     for (const auto& entry : list) {
         if (entry->GetSequenceNumber() == item.GetSequenceNumber())
             return entry;
@@ -170,9 +170,8 @@ bool CEntryOps::MoveEntry(CDocumentItem& item)
     // Only a file of the program's own archive follows its entry; any other
     // file stays where the user keeps it.
     if (categoryChanged && IsInArchive(entry->GetPathname())) {
-        const std::string folder =
-            m_env.Doc().GetFolders().GetArchiveRoot() + "/" +
-            CAppFolders::CategoryToFolder(item.GetDocumentCategoryPath());
+        const std::string folder = m_env.Doc().GetFolders().GetArchiveRoot() + "/" +
+                                   CAppFolders::CategoryToFolder(item.GetDocumentCategoryPath());
         if (FolderOf(entry->GetPathname()) != folder) {
             const std::string moved = MoveArchivedFile(entry->GetPathname(), folder);
             if (!moved.empty())
@@ -188,8 +187,8 @@ bool CEntryOps::MailDocuments(const std::vector<const CDocumentItem*>& items)
     CMailService* mail = m_env.Mail();
     if (!mail || !mail->IsAvailable()) {
         m_env.Prompt().MessageBox(
-            "Error! The mail system is not available - could not find xdg-email",
-            "Send Documents", CPrompt::Icon::Stop);
+            "Error! The mail system is not available - could not find xdg-email", "Send Documents",
+            CPrompt::Icon::Stop);
         return false;
     }
     std::vector<CMailAttachment> attachments;

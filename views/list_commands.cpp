@@ -4,8 +4,7 @@
 
 CListCommands::CListCommands(CDataListState& state, CCommandEnv& env)
     : m_state(state), m_documents(state, env), m_dataItems(state, env)
-{
-}
+{}
 
 int CListCommands::OnCommand(int number)
 {

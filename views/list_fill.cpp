@@ -28,8 +28,7 @@ std::unique_ptr<CCatalogItem> SummaryOf(const Item& item, const std::string& nam
 
 CFilterControls::CFilterControls()
     : fromDate(LocalEpoch()), toDate(CTime(CTime::GetCurrentTime().GetTime() + 24 * 3600))
-{
-}
+{}
 
 std::vector<std::unique_ptr<CCatalogItem>> ItemsOfKind(const CTallowmereDoc& doc,
                                                        const std::string& kindTag)

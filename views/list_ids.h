@@ -2,7 +2,8 @@
 // The list view's tab kinds and the command numbers it receives (from the
 // main frame, its own filter controls and the folder tree).
 
-enum class TabKind : int {
+enum class TabKind : int
+{
     Documents = 0,        // files of a folder, not yet in the catalog
     ManagedDocuments = 1, // the catalog's documents and pictures
     DocumentSets = 2,
@@ -11,7 +12,8 @@ enum class TabKind : int {
     PersonalInformation = 5, // no tab; every command is ignored
 };
 
-enum ListCommand : int {
+enum ListCommand : int
+{
     kCmdLoad = 1323,
     kCmdApplyFilter = 1340,
     kCmdAdd = 1344,

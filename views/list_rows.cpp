@@ -9,8 +9,8 @@
 
 const std::vector<std::string> kDocumentColumns = {"Doc #", "Caption", "Category", "Location",
                                                    "Create Date"};
-const std::vector<std::string> kRecipeColumns = {
-    "Name", "Category", "Primary Ingredient", "Type", "Create Date", "Sequence #"};
+const std::vector<std::string> kRecipeColumns = {"Name", "Category",    "Primary Ingredient",
+                                                 "Type", "Create Date", "Sequence #"};
 const std::vector<std::string> kEventColumns = {"Name", "Category",    "Keyword",
                                                 "Type", "Create Date", "Sequence #"};
 const std::vector<std::string> kDocumentSetColumns = kEventColumns;

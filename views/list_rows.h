@@ -14,9 +14,23 @@ struct CListRow
 };
 
 // Columns of the documents list and of the data item lists.
-enum DocumentColumn { kDocNumber = 0, kDocCaption, kDocCategory, kDocLocation, kDocCreateDate };
-enum DataItemColumn { kItemName = 0, kItemCategory, kItemKeyword, kItemType, kItemCreateDate,
-                      kItemSequence };
+enum DocumentColumn
+{
+    kDocNumber = 0,
+    kDocCaption,
+    kDocCategory,
+    kDocLocation,
+    kDocCreateDate
+};
+enum DataItemColumn
+{
+    kItemName = 0,
+    kItemCategory,
+    kItemKeyword,
+    kItemType,
+    kItemCreateDate,
+    kItemSequence
+};
 
 extern const std::vector<std::string> kDocumentColumns;
 extern const std::vector<std::string> kRecipeColumns;

@@ -13,9 +13,8 @@ bool MatchesFilter(const CCatalogRecord& item, const CSearchFilter& filter)
 {
     const std::string& path = item.GetCategoryPath();
     const std::string& wanted = filter.GetCategoryPath();
-    const bool inCategory = filter.includeSubCategories
-                                ? path.compare(0, wanted.size(), wanted) == 0
-                                : path == wanted;
+    const bool inCategory =
+        filter.includeSubCategories ? path.compare(0, wanted.size(), wanted) == 0 : path == wanted;
     if (filter.categoryTestOn && !inCategory)
         return false;
     if (!filter.filterOn)

@@ -2,8 +2,7 @@
 
 namespace {
 
-template <typename Fields>
-bool Run(CScriptedPrompt::Script<Fields>& script, Fields& fields)
+template <typename Fields> bool Run(CScriptedPrompt::Script<Fields>& script, Fields& fields)
 {
     if (script.empty())
         return false;

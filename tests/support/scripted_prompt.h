@@ -21,8 +21,7 @@ public:
         Buttons buttons;
     };
 
-    template <typename Fields>
-    using Script = std::deque<std::function<bool(Fields&)>>;
+    template <typename Fields> using Script = std::deque<std::function<bool(Fields&)>>;
 
     Answer MessageBox(const std::string& text, const std::string& caption, Icon icon,
                       Buttons buttons) override;
