@@ -267,6 +267,9 @@ void TestDocumentLoad::cancelledLoadChangesNothing()
     QCOMPARE(f.prompt.dialogs, std::vector<std::string>{"Select Folder"});
     QVERIFY(f.prompt.shown.empty());
     QVERIFY(!f.env.Changed());
+    f.ScriptLoad(std::string(), true); // OK without a folder reads nothing
+    QVERIFY(CDocumentLoader(f.env).LoadDocuments(out, false));
+    QCOMPARE(f.prompt.Only().text, std::string("Loaded 0 documents, found 0 duplicate documents."));
 }
 
 void TestDocumentLoad::duplicateRule_data()

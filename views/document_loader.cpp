@@ -125,7 +125,8 @@ bool CDocumentLoader::LoadDocuments(CEntryList& out, bool picturesOnly)
     progress.Begin("Loading documents", 0);
     const std::string selected = WithoutTrailingSlash(fields.selectedFolder);
     CFileEntry top(selected, std::string());
-    top.Scan(true);
+    if (!selected.empty()) // an empty folder would be read as the whole file system
+        top.Scan(true);
     const std::vector<CFileEntry>& files = top.GetChildren();
     progress.Begin("Loading documents", static_cast<int64_t>(files.size()));
 
