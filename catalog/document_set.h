@@ -46,6 +46,9 @@ public:
     // sequence numbers; the name becomes the other set's label. No members.
     explicit CDocumentSet(const CDocumentSet& other);
 
+    // The "Document Sets" dialog; a set without a label is not taken.
+    bool Edit(CAppContext& context) override;
+
     // The base copy, description, label and album flag; the other set's members
     // are shared into this set's list.
     void AssignFrom(const CDocumentSet& other);

@@ -27,6 +27,8 @@ public:
     std::string GetMailText() const override;
     // Offers the event's text to the mail program.
     void Mail(CAppContext& context) override;
+    // The "Event" dialog on a working copy of the fields.
+    bool Edit(CAppContext& context) override;
 
     const std::string& GetEventName() const { return m_eventName; }
     void SetEventName(const std::string& name);

@@ -1,7 +1,10 @@
 #pragma once
 // The one interface through which program logic talks to the user: message
-// boxes now, one call per dialog as the dialogs arrive. The GUI shows real
-// windows, the command line prints, tests script the answers.
+// boxes, and one call per dialog that hands back the dialog's fields. The GUI
+// shows real windows, the command line prints, tests script the answers.
+// Every dialog call returns true for OK; the default is Cancel.
+
+#include "catalog/dialog_fields.h"
 
 #include <string>
 
@@ -25,26 +28,43 @@ public:
     // cannot be started.
     virtual bool OpenWithShell(const std::string& path);
 
-    // The compact folder chooser (a folder tree only). False when cancelled.
-    virtual bool ChooseFolder(std::string& folder) { (void)folder; return false; }
+    // The compact folder chooser (a folder tree only).
+    virtual bool ChooseFolder(std::string& folder) { return Cancel(folder); }
 
-    // A save-as file dialog: default extension and a filter such as
-    // "Files(*.txt;)|*.txt;|". False when cancelled.
+    // A save-as file dialog with a default extension and a filter such as
+    // "Files(*.txt;)|*.txt;|".
     virtual bool GetSaveFileName(const std::string& defaultExtension, const std::string& filter,
                                  std::string& path)
     {
         (void)defaultExtension;
         (void)filter;
-        (void)path;
-        return false;
+        return Cancel(path);
     }
 
     // The print dialog: a CUPS queue (printerName) or a PDF file (pdfPath, and
-    // printerName empty). False when cancelled or when there is no printer.
+    // printerName empty). Cancelled also when there is no printer.
     virtual bool ChoosePrinter(std::string& printerName, std::string& pdfPath)
     {
         (void)printerName;
-        (void)pdfPath;
+        return Cancel(pdfPath);
+    }
+
+    virtual bool SelectFolder(CSelectFolderFields& fields) { return Cancel(fields); }
+    virtual bool ChooseDocumentFiles(CDocumentFileFields& fields) { return Cancel(fields); }
+    virtual bool ManageFiles(CManageFilesFields& fields) { return Cancel(fields); }
+    virtual bool ChooseCategory(CCategoryChooserFields& fields) { return Cancel(fields); }
+    virtual bool UpdateDocumentSet(CUpdateDocumentSetFields& fields) { return Cancel(fields); }
+    virtual bool NewCategory(CNewCategoryFields& fields) { return Cancel(fields); }
+    virtual bool EditDocumentEntry(CEntryEditFields& fields) { return Cancel(fields); }
+    virtual bool EditPictureEntry(CEntryEditFields& fields) { return Cancel(fields); }
+    virtual bool EditEvent(CEventFields& fields) { return Cancel(fields); }
+    virtual bool EditRecipe(CRecipeFields& fields) { return Cancel(fields); }
+    virtual bool EditDocumentSet(CDocumentSetFields& fields) { return Cancel(fields); }
+
+private:
+    template <typename T>
+    static bool Cancel(T&)
+    {
         return false;
     }
 };

@@ -44,6 +44,8 @@ public:
     const std::string& GetWebPagePath() const { return m_webPagePath; }
     // "%6s   %-16s%s": amount, measurement, ingredient.
     static std::string IngredientLine(const CIngredient& ingredient);
+    // The "Recipe" dialog; a recipe without a dish name is not taken.
+    bool Edit(CAppContext& context) override;
 
     const std::string& GetDirections() const { return m_directions; }
     void SetDirections(const std::string& text) { m_directions = text; }

@@ -7,6 +7,7 @@
 #include "catalog/catalog_items.h"
 #include "catalog/catalog_settings.h"
 #include "catalog/category.h"
+#include "catalog/current_items.h"
 
 #include <functional>
 #include <memory>
@@ -95,6 +96,8 @@ public:
     int32_t& LoadCounter() { return m_loadCounter; }
     const std::string& GetCurrentCategoryPath() const { return m_currentCategoryPath; }
     void SetCurrentCategoryPath(const std::string& path) { m_currentCategoryPath = path; }
+    // The items the preview panes show (not stored).
+    CCurrentItems& GetCurrentItems() { return m_currentItems; }
     // The format version of the file last read (0 before any read).
     int GetFormatVersion() const { return m_formatVersion; }
 
@@ -142,4 +145,5 @@ private:
     int32_t m_loadCounter = 0;
     int m_formatVersion = 0;
     std::vector<std::function<void(int)>> m_observers;
+    CCurrentItems m_currentItems;
 };

@@ -107,7 +107,7 @@ private slots:
         CScriptedPrompt prompt;
         const auto event = EventWithLines("A", 1);
         QVERIFY(!PrintDataItems(prompt, {event.get()}));
-        QCOMPARE(prompt.dialogsShown, std::vector<std::string>{"ChoosePrinter"});
+        QCOMPARE(prompt.dialogs, std::vector<std::string>{"ChoosePrinter"});
         QVERIFY(prompt.shown.empty());
     }
 
@@ -159,7 +159,7 @@ private slots:
         const QString path = dir.path() + "/recipes.txt";
         prompt.saveFileAnswers.push_back(path.toStdString());
         QVERIFY(SaveDataItemsToFile(prompt, items));
-        QCOMPARE(prompt.dialogsShown,
+        QCOMPARE(prompt.dialogs,
                  std::vector<std::string>{"GetSaveFileName txt Files(*.txt;)|*.txt;|"});
         QFile file(path);
         QVERIFY(file.open(QIODevice::ReadOnly));

@@ -1,5 +1,18 @@
 #include "tests/support/scripted_prompt.h"
 
+namespace {
+
+template <typename Fields> bool Run(CScriptedPrompt::Script<Fields>& script, Fields& fields)
+{
+    if (script.empty())
+        return false;
+    const auto answer = std::move(script.front());
+    script.pop_front();
+    return answer(fields);
+}
+
+} // namespace
+
 CPrompt::Answer CScriptedPrompt::MessageBox(const std::string& text, const std::string& caption,
                                             Icon icon, Buttons buttons)
 {
@@ -19,6 +32,72 @@ CPrompt::Answer CScriptedPrompt::MessageBox(const std::string& text, const std::
         return Answer::No;
     }
     return Answer::Cancel;
+}
+
+bool CScriptedPrompt::SelectFolder(CSelectFolderFields& fields)
+{
+    dialogs.push_back("Select Folder");
+    return Run(selectFolder, fields);
+}
+
+bool CScriptedPrompt::ChooseDocumentFiles(CDocumentFileFields& fields)
+{
+    dialogs.push_back(fields.title);
+    return Run(documentFiles, fields);
+}
+
+bool CScriptedPrompt::ManageFiles(CManageFilesFields& fields)
+{
+    dialogs.push_back("Manage Files Dialog");
+    return Run(manageFiles, fields);
+}
+
+bool CScriptedPrompt::ChooseCategory(CCategoryChooserFields& fields)
+{
+    dialogs.push_back(fields.caption);
+    return Run(chooseCategory, fields);
+}
+
+bool CScriptedPrompt::UpdateDocumentSet(CUpdateDocumentSetFields& fields)
+{
+    dialogs.push_back("Update Document Set");
+    return Run(updateDocumentSet, fields);
+}
+
+bool CScriptedPrompt::NewCategory(CNewCategoryFields& fields)
+{
+    dialogs.push_back("New Category");
+    return Run(newCategory, fields);
+}
+
+bool CScriptedPrompt::EditDocumentEntry(CEntryEditFields& fields)
+{
+    dialogs.push_back("Edit Document");
+    return Run(editDocumentEntry, fields);
+}
+
+bool CScriptedPrompt::EditPictureEntry(CEntryEditFields& fields)
+{
+    dialogs.push_back("Edit Picture Entry");
+    return Run(editPictureEntry, fields);
+}
+
+bool CScriptedPrompt::EditEvent(CEventFields& fields)
+{
+    dialogs.push_back("Event");
+    return Run(editEvent, fields);
+}
+
+bool CScriptedPrompt::EditRecipe(CRecipeFields& fields)
+{
+    dialogs.push_back("Recipe");
+    return Run(editRecipe, fields);
+}
+
+bool CScriptedPrompt::EditDocumentSet(CDocumentSetFields& fields)
+{
+    dialogs.push_back("Document Sets");
+    return Run(editDocumentSet, fields);
 }
 
 CScriptedPrompt::Shown CScriptedPrompt::Only() const
@@ -47,20 +126,20 @@ bool CScriptedPrompt::OpenWithShell(const std::string& path)
 
 bool CScriptedPrompt::ChooseFolder(std::string& folder)
 {
-    dialogsShown.push_back("ChooseFolder");
+    dialogs.push_back("ChooseFolder");
     return Take(folderAnswers, folder);
 }
 
 bool CScriptedPrompt::GetSaveFileName(const std::string& defaultExtension,
                                       const std::string& filter, std::string& path)
 {
-    dialogsShown.push_back("GetSaveFileName " + defaultExtension + " " + filter);
+    dialogs.push_back("GetSaveFileName " + defaultExtension + " " + filter);
     return Take(saveFileAnswers, path);
 }
 
 bool CScriptedPrompt::ChoosePrinter(std::string& printerName, std::string& pdfPath)
 {
-    dialogsShown.push_back("ChoosePrinter");
+    dialogs.push_back("ChoosePrinter");
     printerName.clear();
     return Take(pdfAnswers, pdfPath);
 }

@@ -1,10 +1,12 @@
 #pragma once
-// A prompt for tests: records every message shown and answers from a queue
-// (the safe answer, No or Cancel, when the queue is empty).
+// A prompt for tests: records every message and dialog shown and answers from
+// queues (the safe answer, No or Cancel, when a queue is empty). A dialog is
+// scripted as a function that fills the fields and returns true for OK.
 
 #include "catalog/prompt.h"
 
 #include <deque>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -19,6 +21,8 @@ public:
         Buttons buttons;
     };
 
+    template <typename Fields> using Script = std::deque<std::function<bool(Fields&)>>;
+
     Answer MessageBox(const std::string& text, const std::string& caption, Icon icon,
                       Buttons buttons) override;
     void ShowReadMe(const std::string& text) override { readMeShown.push_back(text); }
@@ -27,6 +31,18 @@ public:
     bool GetSaveFileName(const std::string& defaultExtension, const std::string& filter,
                          std::string& path) override;
     bool ChoosePrinter(std::string& printerName, std::string& pdfPath) override;
+
+    bool SelectFolder(CSelectFolderFields& fields) override;
+    bool ChooseDocumentFiles(CDocumentFileFields& fields) override;
+    bool ManageFiles(CManageFilesFields& fields) override;
+    bool ChooseCategory(CCategoryChooserFields& fields) override;
+    bool UpdateDocumentSet(CUpdateDocumentSetFields& fields) override;
+    bool NewCategory(CNewCategoryFields& fields) override;
+    bool EditDocumentEntry(CEntryEditFields& fields) override;
+    bool EditPictureEntry(CEntryEditFields& fields) override;
+    bool EditEvent(CEventFields& fields) override;
+    bool EditRecipe(CRecipeFields& fields) override;
+    bool EditDocumentSet(CDocumentSetFields& fields) override;
 
     void QueueAnswer(Answer answer) { answers.push_back(answer); }
     // The one message shown, or an empty record when there was not exactly one.
@@ -39,5 +55,17 @@ public:
     std::deque<std::string> folderAnswers;     // ChooseFolder; none left: cancelled
     std::deque<std::string> saveFileAnswers;   // GetSaveFileName; none left: cancelled
     std::deque<std::string> pdfAnswers;        // ChoosePrinter prints to these PDF files
-    std::vector<std::string> dialogsShown;     // the dialogs' names, in order
+    std::vector<std::string> dialogs; // names of the dialogs run, in order
+
+    Script<CSelectFolderFields> selectFolder;
+    Script<CDocumentFileFields> documentFiles;
+    Script<CManageFilesFields> manageFiles;
+    Script<CCategoryChooserFields> chooseCategory;
+    Script<CUpdateDocumentSetFields> updateDocumentSet;
+    Script<CNewCategoryFields> newCategory;
+    Script<CEntryEditFields> editDocumentEntry;
+    Script<CEntryEditFields> editPictureEntry;
+    Script<CEventFields> editEvent;
+    Script<CRecipeFields> editRecipe;
+    Script<CDocumentSetFields> editDocumentSet;
 };
