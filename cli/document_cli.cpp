@@ -7,7 +7,7 @@
 #include <cstdio>
 
 CDocumentCli::CDocumentCli(CliContext& context, CPrompt::Answer questions)
-    : m_context(context), m_answers(questions)
+    : m_context(context), m_answers(questions), m_services(m_answers)
 {}
 
 bool CDocumentCli::Open()
@@ -16,6 +16,7 @@ bool CDocumentCli::Open()
     if (!m_doc->OpenCatalog(false))
         return false;
     m_env = std::make_unique<CCommandEnv>(*m_doc);
+    m_services.InstallInto(*m_env);
     return true;
 }
 

@@ -5,6 +5,7 @@
 #include "catalog/tallowmere_doc.h"
 #include "cli/cli_command.h"
 #include "cli/dialog_answers.h"
+#include "output/output_services.h"
 #include "views/command_env.h"
 #include "views/list_rows.h"
 
@@ -37,6 +38,7 @@ private:
     CDialogAnswers m_answers;
     std::unique_ptr<CTallowmereDoc> m_doc;
     std::unique_ptr<CCommandEnv> m_env;
+    COutputServices m_services;
 };
 
 // Prints a row: its cells separated by tabs, on one line.

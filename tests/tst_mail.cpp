@@ -5,6 +5,7 @@
 #include "catalog/catalog_items.h"
 #include "output/item_mail.h"
 #include "output/mapi_mail.h"
+#include "output/output_services.h"
 #include "tests/support/scripted_prompt.h"
 
 #include <QFile>
@@ -106,6 +107,19 @@ private slots:
         QCOMPARE(Recorded(), (QStringList{"--subject", "Hearthbook support issue", "--body", "",
                                           "support@hearthbook.example"}));
         QVERIFY(prompt.shown.empty());
+    }
+
+    void documentsThroughTheCommandLayer()
+    {
+        CScriptedPrompt prompt;
+        CMailProgram service(prompt);
+        QVERIFY(service.IsAvailable());
+        const QString letter = MakeFile("letter.pdf");
+        QVERIFY(service.SendDocuments({{letter.toStdString(), "letter.pdf"},
+                                       {(m_dir.path() + "/gone.pdf").toStdString(), "gone.pdf"}}));
+        QCOMPARE(Recorded(), (QStringList{"--subject", "", "--body", " ", "--attach", letter}));
+        qputenv("HEARTHBOOK_MAIL_COMMAND", "hearthbook-no-such-mail-program");
+        QVERIFY(!service.IsAvailable());
     }
 
     void noMailProgram()
