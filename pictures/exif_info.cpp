@@ -173,7 +173,9 @@ int CExifInfo::WalkSegments(Source& source)
         const int64_t length = head[0] << 8 | head[1];
         const int64_t d = p + 3;
         if (marker == 0xE1 && source.ReadAt(d, head, 4) == 4 && std::memcmp(head, "Exif", 4) == 0) {
-            std::string block(static_cast<size_t>(std::max<int64_t>(length - 6, 0)), '\0');
+            // The block is the segment's own bytes after "Exif\0\0": L less the
+            // length field and those six.
+            std::string block(static_cast<size_t>(std::max<int64_t>(length - 8, 0)), '\0');
             auto* bytes = reinterpret_cast<uint8_t*>(block.data());
             block.resize(source.ReadAt(d + 6, bytes, block.size()));
             ParseTiffBlock(bytes, block.size());
@@ -237,17 +239,20 @@ void CExifInfo::ParseDirectory(Walk& walk, int64_t start, int depth)
         const int64_t v = bytes > 4 ? int64_t(Read32(entry + 8, walk.bigEndian)) - 8 : e + 8;
         if (v < 0 || v >= walk.size)
             return;
-        if (!ApplyTag(walk, tag, type, v, depth))
+        if (!ApplyTag(walk, tag, type, v, std::max<int64_t>(bytes, 0), depth))
             break;
     }
     exifRead = 1;
 }
 
-bool CExifInfo::ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int depth)
+bool CExifInfo::ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int64_t bytes, int depth)
 {
     const uint8_t* value = walk.data + v;
     const size_t left = static_cast<size_t>(walk.size - v);
-    auto text = [&](size_t most) { return TextUpToNul(value, std::min(most, left)); };
+    // A text ends at its NUL, its limit, the end of the data, and also the end of
+    // its own value: an unterminated text must not run into its neighbour's bytes.
+    const size_t own = static_cast<size_t>(std::min<int64_t>(bytes, walk.size - v));
+    auto text = [&](size_t most) { return TextUpToNul(value, std::min(most, own)); };
     auto number = [&](float& target) {
         if (NumericValueSize(type) > left)
             return false;
@@ -279,15 +284,15 @@ bool CExifInfo::ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int dept
         return integer(resolutionUnit);
     case 0x0131:
         if (software.empty())
-            software = text(left);
+            software = text(own);
         return true;
     case 0x013B:
         if (artist.empty())
-            artist = text(left);
+            artist = text(own);
         return true;
     case 0x8298:
         if (copyright.empty())
-            copyright = text(left);
+            copyright = text(own);
         return true;
     case 0x829A:
         return number(exposureTime);
@@ -340,7 +345,7 @@ bool CExifInfo::ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int dept
     case 0x920A:
         return number(focalLength);
     case 0x9286: {
-        const size_t n = std::min<size_t>(100, left);
+        const size_t n = std::min<size_t>(100, own);
         if (n >= 5 && std::memcmp(value, "ASCII", 5) == 0)
             comments = n > 8 ? TextUpToNul(value + 8, n - 8) : std::string();
         else

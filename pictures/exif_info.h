@@ -75,5 +75,5 @@ private:
     int WalkSegments(Source& source);
     void ParseDirectory(Walk& walk, int64_t start, int depth);
     // False when a value the tag needs lies past the end of the data.
-    bool ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int depth);
+    bool ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int64_t bytes, int depth);
 };

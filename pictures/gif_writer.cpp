@@ -50,24 +50,23 @@ bool ExactIndexes(const QImage& image, Palette& palette, std::vector<GifByteType
     return true;
 }
 
-// Nearest palette colour, cached per 5-bit-per-channel cell.
+// Nearest palette colour, cached per 6-bit-per-channel cell.
 class NearestColor
 {
 public:
     explicit NearestColor(const std::vector<GifColorType>& colors)
-        : m_colors(colors), m_cache(32768, -1)
+        : m_colors(colors), m_cache(1 << 18, -1)
     {
     }
 
     int Find(int r, int g, int b)
     {
-        const int key = (r >> 3) << 10 | (g >> 3) << 5 | (b >> 3);
+        const int key = (r >> 2) << 12 | (g >> 2) << 6 | (b >> 2);
         if (m_cache[key] < 0)
-            m_cache[key] = Search((r & ~7) + 4, (g & ~7) + 4, (b & ~7) + 4);
+            m_cache[key] = Search((r & ~3) + 2, (g & ~3) + 2, (b & ~3) + 2);
         return m_cache[key];
     }
 
-private:
     int Search(int r, int g, int b) const
     {
         int best = 0;
@@ -84,11 +83,59 @@ private:
         return best;
     }
 
+private:
     const std::vector<GifColorType>& m_colors;
     std::vector<int> m_cache;
 };
 
-// Median-cut palette (giflib's), then Floyd-Steinberg error diffusion.
+// Moves each palette colour to the mean of the colours nearest to it (a few
+// k-means rounds over a 5-bit histogram), which evens out median-cut boxes.
+void RefinePalette(const QImage& image, std::vector<GifColorType>& colors)
+{
+    struct Cell
+    {
+        qint64 count = 0, r = 0, g = 0, b = 0;
+    };
+    std::vector<Cell> cells(32768);
+    for (int y = 0; y < image.height(); ++y) {
+        const auto* line = reinterpret_cast<const QRgb*>(image.constScanLine(y));
+        for (int x = 0; x < image.width(); ++x) {
+            if (IsTransparent(line[x]))
+                continue;
+            const int r = qRed(line[x]), g = qGreen(line[x]), b = qBlue(line[x]);
+            Cell& c = cells[size_t((r >> 3) << 10 | (g >> 3) << 5 | (b >> 3))];
+            ++c.count;
+            c.r += r;
+            c.g += g;
+            c.b += b;
+        }
+    }
+    std::vector<Cell> used;
+    for (const Cell& c : cells) {
+        if (c.count)
+            used.push_back(c);
+    }
+    for (int round = 0; round < 6; ++round) {
+        NearestColor nearest(colors);
+        std::vector<Cell> sums(colors.size());
+        for (const Cell& c : used) {
+            Cell& s = sums[size_t(nearest.Search(int(c.r / c.count), int(c.g / c.count),
+                                                 int(c.b / c.count)))];
+            s.count += c.count;
+            s.r += c.r;
+            s.g += c.g;
+            s.b += c.b;
+        }
+        for (size_t i = 0; i < colors.size(); ++i) {
+            if (sums[i].count)
+                colors[i] = {GifByteType(sums[i].r / sums[i].count),
+                             GifByteType(sums[i].g / sums[i].count),
+                             GifByteType(sums[i].b / sums[i].count)};
+        }
+    }
+}
+
+// Median-cut palette (giflib's) refined, then Floyd-Steinberg error diffusion.
 bool QuantizedIndexes(const QImage& image, Palette& palette, std::vector<GifByteType>& indexes)
 {
     const size_t count = size_t(image.width()) * size_t(image.height());
@@ -108,6 +155,7 @@ bool QuantizedIndexes(const QImage& image, Palette& palette, std::vector<GifByte
                           green.data(), blue.data(), indexes.data(), colors.data()) != GIF_OK)
         return false;
     colors.resize(size_t(size));
+    RefinePalette(image, colors);
     palette.colors = colors;
 
     NearestColor nearest(palette.colors);
