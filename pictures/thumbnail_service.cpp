@@ -7,6 +7,12 @@ namespace {
 
 constexpr int kDefaultMemoryKilobytes = 128 * 1024;
 
+// Keys are "<thumbnail edge>|<absolute path>".
+QString PathOfKey(const QString& key)
+{
+    return key.mid(key.indexOf(QLatin1Char('|')) + 1);
+}
+
 } // namespace
 
 CThumbnailService::CThumbnailService(const QString& cacheRoot, QObject* parent)
@@ -78,20 +84,19 @@ void CThumbnailService::Deliver(const QString& key, quint64 request, const CThum
     m_pending.remove(key);
     if (thumbnail.status != CThumbnail::Missing)
         Remember(key, thumbnail);
-    emit ThumbnailReady(key.section(QLatin1Char('|'), 1));
+    emit ThumbnailReady(PathOfKey(key));
 }
 
 void CThumbnailService::Invalidate(const QString& path)
 {
     const QString absolute = QFileInfo(path).absoluteFilePath();
-    const QString suffix = QLatin1Char('|') + absolute;
     const QList<QString> keys = m_memory.keys();
     for (const QString& key : keys) {
-        if (key.endsWith(suffix))
+        if (PathOfKey(key) == absolute)
             m_memory.remove(key);
     }
     for (auto it = m_pending.begin(); it != m_pending.end();) {
-        if (it.key().endsWith(suffix))
+        if (PathOfKey(it.key()) == absolute)
             it = m_pending.erase(it);
         else
             ++it;
