@@ -31,23 +31,34 @@ QString Option(const char* name)
     return QString::fromLatin1(name);
 }
 
+// With several files each report is headed by "==> FILE <==" and followed
+// by an empty line; a file without camera data prints nothing.
 int RunExif(CliContext& c)
 {
-    if (c.arguments.size() != 1)
-        return c.Usage(QStringLiteral("exif takes one picture file"));
-    const QString path = c.arguments.at(0);
-    CExifInfo info;
-    if (!info.ReadExif(NativePath(path)) && !QFileInfo(path).isReadable()) {
-        c.Failure(QStringLiteral("cannot read %1").arg(path));
-        return kExitNoExif;
+    if (c.arguments.isEmpty())
+        return c.Usage(QStringLiteral("exif takes one or more picture files"));
+    const bool headed = c.arguments.size() > 1;
+    int result = kExitOk;
+    for (const QString& path : c.arguments) {
+        CExifInfo info;
+        if (!info.ReadExif(NativePath(path)) && !QFileInfo(path).isReadable()) {
+            c.Failure(QStringLiteral("cannot read %1").arg(path));
+            result = kExitNoExif;
+            continue;
+        }
+        if (!info.exifRead) {
+            c.Failure(QStringLiteral("%1 holds no EXIF data").arg(path));
+            result = kExitNoExif;
+            continue;
+        }
+        std::string text = BuildExifReport(info);
+        if (headed)
+            text = "==> " + NativePath(path) + " <==\r\n" + text + "\r\n";
+        std::fwrite(text.data(), 1, text.size(), stdout);
     }
-    if (!info.exifRead) {
-        c.Failure(QStringLiteral("%1 holds no EXIF data").arg(path));
-        return kExitNoExif;
-    }
-    const std::string report = BuildExifReport(info);
-    std::fwrite(report.data(), 1, report.size(), stdout);
-    return std::fflush(stdout) == 0 ? kExitOk : kExitFailure;
+    if (std::fflush(stdout) != 0)
+        return kExitFailure;
+    return result;
 }
 
 void AddThumbnailOptions(QCommandLineParser& parser)
@@ -195,9 +206,9 @@ int RunPicture(CliContext& c)
     return kExitOk;
 }
 
-const CliRegistration kExif{{QStringLiteral("exif"), QStringLiteral("FILE"),
-                             QStringLiteral("The camera information (EXIF) of a JPEG picture; "
-                                            "exit 1 when it has none."),
+const CliRegistration kExif{{QStringLiteral("exif"), QStringLiteral("FILE..."),
+                             QStringLiteral("The camera information (EXIF) of JPEG pictures; "
+                                            "exit 1 when one has none."),
                              nullptr, RunExif}};
 const CliRegistration kThumbnail{{QStringLiteral("thumbnail"),
                                   QStringLiteral("FILE --size N --out PNG"),

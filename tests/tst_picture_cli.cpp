@@ -42,6 +42,7 @@ private slots:
     void exifReport();
     void exifWithoutExif_data();
     void exifWithoutExif();
+    void exifOfSeveralFiles();
     void thumbnail();
     void pictureOperationsInOrder_data();
     void pictureOperationsInOrder();
@@ -95,6 +96,26 @@ void TestPictureCli::exifWithoutExif()
     QCOMPARE(run.exitCode, 1);
     QCOMPARE(run.out, QByteArray());
     QVERIFY(!run.err.isEmpty());
+}
+
+void TestPictureCli::exifOfSeveralFiles()
+{
+    const QString a = QStringLiteral(HB_SHARED_TESTDATA "/exif-samples/jpg/Canon_40D.jpg");
+    const QString b = QStringLiteral(HB_SHARED_TESTDATA "/exif-samples/jpg/Nikon_D70.jpg");
+    if (!QFileInfo::exists(a) || !QFileInfo::exists(b))
+        QSKIP("camera samples not found");
+    Run run = Cli({"exif", a, b}, m_cache);
+    QCOMPARE(run.exitCode, 0);
+    QVERIFY(run.out.startsWith("==> " + QFile::encodeName(a) + " <==\r\nCamera Make:\tCanon\r\n"));
+    const qsizetype second = run.out.indexOf("\r\n\r\n==> " + QFile::encodeName(b) + " <==\r\n");
+    QVERIFY(second > 0);
+    QVERIFY(run.out.mid(second).contains("\r\nCamera Model:\tNIKON D70\r\n"));
+    QCOMPARE(run.out.count("==> "), 2);
+
+    run = Cli({"exif", a, m_source}, m_cache);
+    QCOMPARE(run.exitCode, 1);
+    QCOMPARE(run.out.count("==> "), 1);
+    QVERIFY(run.err.contains("source.png"));
 }
 
 void TestPictureCli::thumbnail()
