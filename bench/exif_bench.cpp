@@ -28,7 +28,8 @@ int main(int argc, char** argv)
                 reports += BuildExifReport(info).size();
         }
     }
-    const std::chrono::duration<double, std::micro> spent = std::chrono::steady_clock::now() - start;
+    const std::chrono::duration<double, std::micro> spent =
+        std::chrono::steady_clock::now() - start;
     std::printf("files %zu\nrounds %d\nmicroseconds_per_file %.1f\nreport_bytes %zu\n",
                 files.size(), rounds, spent.count() / (double(rounds) * files.size()),
                 reports / size_t(rounds > 0 ? rounds : 1));

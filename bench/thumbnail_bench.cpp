@@ -28,7 +28,8 @@ QImage PhotoLike(int seed)
     painter.fillRect(image.rect(), sky);
     painter.setRenderHint(QPainter::Antialiasing);
     for (int k = 0; k < 300; ++k) {
-        painter.setBrush(QColor::fromHsv(random.bounded(360), random.bounded(256), 60 + random.bounded(196)));
+        painter.setBrush(
+            QColor::fromHsv(random.bounded(360), random.bounded(256), 60 + random.bounded(196)));
         painter.setPen(Qt::NoPen);
         painter.drawEllipse(QPoint(random.bounded(4000), random.bounded(3000)),
                             20 + random.bounded(300), 20 + random.bounded(300));
@@ -50,7 +51,8 @@ int Generate(const QString& dir, int count)
 {
     QDir().mkpath(dir);
     for (int i = 0; i < count; ++i) {
-        const QString path = QStringLiteral("%1/photo-%2.jpg").arg(dir).arg(i, 3, 10, QLatin1Char('0'));
+        const QString path =
+            QStringLiteral("%1/photo-%2.jpg").arg(dir).arg(i, 3, 10, QLatin1Char('0'));
         if (QFileInfo::exists(path))
             continue;
         const QString partial = path + QStringLiteral(".part");

@@ -34,7 +34,11 @@ public:
 
     // Picture forms: 0 display (drawing only), 1 editable. The editable form,
     // once loaded, stays for the item's life; LoadImage then returns 1 at once.
-    enum ImageMode { kDisplayForm = 0, kEditableForm = 1 };
+    enum ImageMode
+    {
+        kDisplayForm = 0,
+        kEditableForm = 1
+    };
     // 1 when loaded (and the EXIF block read again); 0 after a failed load.
     int LoadImage(int mode);
     int EnsureLoaded();

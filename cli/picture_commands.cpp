@@ -65,8 +65,8 @@ void AddThumbnailOptions(QCommandLineParser& parser)
 {
     parser.addOption({Option("size"), QStringLiteral("Longer side of the thumbnail, at most."),
                       QStringLiteral("N")});
-    parser.addOption({Option("out"), QStringLiteral("The PNG file to write."),
-                      QStringLiteral("PNG")});
+    parser.addOption(
+        {Option("out"), QStringLiteral("The PNG file to write."), QStringLiteral("PNG")});
 }
 
 bool WritePng(const QImage& image, const QString& path)
@@ -126,8 +126,8 @@ void AddPictureOptions(QCommandLineParser& parser)
     parser.addOption({Option("less-contrast"),
                       QStringLiteral("Move dark pixels N lighter and light ones N darker."),
                       QStringLiteral("N")});
-    parser.addOption({Option("scale"), QStringLiteral("Stretch to W x H pixels."),
-                      QStringLiteral("WxH")});
+    parser.addOption(
+        {Option("scale"), QStringLiteral("Stretch to W x H pixels."), QStringLiteral("WxH")});
     parser.addOption({Option("crop"),
                       QStringLiteral("Keep the W x H block whose top-left corner is (X, Y)."),
                       QStringLiteral("WxH+X+Y")});
@@ -147,9 +147,9 @@ QString ApplyOperation(CPictureItem& picture, const QString& name, const QString
         if (!m.hasMatch())
             return QStringLiteral("--%1 takes %2").arg(name, scale ? "WxH" : "WxH+X+Y");
         const int w = m.captured(1).toInt(), h = m.captured(2).toInt();
-        const int done = scale ? picture.ScaleImage(w, h)
-                               : picture.CropImage(w, h, m.captured(3).toInt(),
-                                                   m.captured(4).toInt());
+        const int done =
+            scale ? picture.ScaleImage(w, h)
+                  : picture.CropImage(w, h, m.captured(3).toInt(), m.captured(4).toInt());
         if (done)
             return QString();
         return QStringLiteral("--%1 %2 cannot be done on the %3 x %4 picture")
@@ -193,8 +193,8 @@ int RunPicture(CliContext& c)
             name == QLatin1String("catalog"))
             continue;
         const QStringList values = c.parser.values(name);
-        const QString value = name == QLatin1String("rotate") ? QString()
-                                                              : values.value(used[name]++);
+        const QString value =
+            name == QLatin1String("rotate") ? QString() : values.value(used[name]++);
         const QString error = ApplyOperation(picture, name, value);
         if (!error.isEmpty())
             return c.Failure(error);

@@ -58,8 +58,7 @@ private:
 class FileSource
 {
 public:
-    explicit FileSource(const std::string& path)
-        : m_fd(::open(path.c_str(), O_RDONLY | O_CLOEXEC))
+    explicit FileSource(const std::string& path) : m_fd(::open(path.c_str(), O_RDONLY | O_CLOEXEC))
     {
         struct stat st;
         if (m_fd >= 0 && ::fstat(m_fd, &st) == 0 && S_ISREG(st.st_mode))
@@ -145,12 +144,10 @@ bool CExifInfo::IsFrameHeaderMarker(uint8_t marker)
 {
     // Start-of-frame codes; C4 (Huffman tables), C8 (reserved) and CC (arithmetic
     // conditioning) share the high nibble but carry no frame size.
-    return marker >= 0xC0 && marker <= 0xCF && marker != 0xC4 && marker != 0xC8 &&
-           marker != 0xCC;
+    return marker >= 0xC0 && marker <= 0xCF && marker != 0xC4 && marker != 0xC8 && marker != 0xCC;
 }
 
-template <typename Source>
-int CExifInfo::WalkSegments(Source& source)
+template <typename Source> int CExifInfo::WalkSegments(Source& source)
 {
     uint8_t head[5];
     if (source.ReadAt(0, head, 2) < 2 || head[0] != 0xFF || head[1] != 0xD8)
@@ -404,8 +401,9 @@ float CExifInfo::GetNumericValue(int type, bool bigEndian, const uint8_t* value)
         return static_cast<float>(static_cast<int32_t>(Read32(value, bigEndian)));
     case 5: {
         const uint32_t denominator = Read32(value + 4, bigEndian);
-        return denominator == 0 ? 0.0f
-                                : static_cast<float>(double(Read32(value, bigEndian)) / denominator);
+        return denominator == 0
+                   ? 0.0f
+                   : static_cast<float>(double(Read32(value, bigEndian)) / denominator);
     }
     case 10: {
         const auto numerator = static_cast<int32_t>(Read32(value, bigEndian));

@@ -71,8 +71,7 @@ public:
 
 private:
     struct Walk;
-    template <typename Source>
-    int WalkSegments(Source& source);
+    template <typename Source> int WalkSegments(Source& source);
     void ParseDirectory(Walk& walk, int64_t start, int depth);
     // False when a value the tag needs lies past the end of the data.
     bool ApplyTag(Walk& walk, uint16_t tag, int type, int64_t v, int64_t bytes, int depth);

@@ -14,7 +14,7 @@ const char* UnitWord(int32_t unit)
 
 const char* ProgramText(int32_t program)
 {
-    static const char* const texts[] = {"Manual",           "Normal Program", "Aperture priority",
+    static const char* const texts[] = {"Manual",           "Normal Program",   "Aperture priority",
                                         "Shutter priority", "Creative program", "Action program",
                                         "Portrait mode",    "Landscape mode"};
     return program >= 1 && program <= 8 ? texts[program - 1] : nullptr;
@@ -22,8 +22,8 @@ const char* ProgramText(int32_t program)
 
 const char* MeteringText(int32_t mode)
 {
-    static const char* const texts[] = {"Average", "Center Weighted Average", "Spot",
-                                        "Multispot", "Pattern", "Partial"};
+    static const char* const texts[] = {
+        "Average", "Center Weighted Average", "Spot", "Multispot", "Pattern", "Partial"};
     return mode >= 1 && mode <= 6 ? texts[mode - 1] : nullptr;
 }
 
@@ -50,8 +50,8 @@ std::string BuildExifReport(const CExifInfo& info)
     r += StrFormat("Y Resolution:\t%4.1f (pixels per %s)\r\n", double(info.yResolution),
                    UnitWord(info.resolutionUnit));
     const float t = ReportExposureTime(info);
-    r += StrFormat("Exposure time:\t%5.3f (1/%d)\r\n", double(t),
-                   CExifInfo::ToInt(1.0f / t + 0.5f));
+    r +=
+        StrFormat("Exposure time:\t%5.3f (1/%d)\r\n", double(t), CExifInfo::ToInt(1.0f / t + 0.5f));
     r += StrFormat("Exposure bias:\t%4.3f\r\n", double(info.exposureBias));
     if (const char* program = ProgramText(info.exposureProgram))
         r += StrFormat("Exposure program:\t%s\r\n", program);

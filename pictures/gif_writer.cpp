@@ -56,8 +56,7 @@ class NearestColor
 public:
     explicit NearestColor(const std::vector<GifColorType>& colors)
         : m_colors(colors), m_cache(1 << 18, -1)
-    {
-    }
+    {}
 
     int Find(int r, int g, int b)
     {
@@ -119,8 +118,8 @@ void RefinePalette(const QImage& image, std::vector<GifColorType>& colors)
         NearestColor nearest(colors);
         std::vector<Cell> sums(colors.size());
         for (const Cell& c : used) {
-            Cell& s = sums[size_t(nearest.Search(int(c.r / c.count), int(c.g / c.count),
-                                                 int(c.b / c.count)))];
+            Cell& s = sums[size_t(
+                nearest.Search(int(c.r / c.count), int(c.g / c.count), int(c.b / c.count)))];
             s.count += c.count;
             s.r += c.r;
             s.g += c.g;
@@ -215,8 +214,7 @@ bool Encode(GifFileType* gif, const QImage& image, const Palette& palette,
         const GifByteType control[4] = {0x01, 0, 0, GifByteType(palette.transparent)};
         ok = EGifPutExtension(gif, GRAPHICS_EXT_FUNC_CODE, 4, control) == GIF_OK;
     }
-    ok = ok && EGifPutImageDesc(gif, 0, 0, image.width(), image.height(), false, nullptr) ==
-                   GIF_OK;
+    ok = ok && EGifPutImageDesc(gif, 0, 0, image.width(), image.height(), false, nullptr) == GIF_OK;
     for (int y = 0; ok && y < image.height(); ++y) {
         auto* line = const_cast<GifByteType*>(indexes.data() + size_t(y) * image.width());
         ok = EGifPutLine(gif, line, image.width()) == GIF_OK;

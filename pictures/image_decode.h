@@ -15,8 +15,8 @@ bool FitsDecodeLimits(const QSize& size, int bitsPerPixel = 32);
 
 struct CDecodedPicture
 {
-    QImage image;        // null when the file cannot be decoded
-    QSize pictureSize;   // the whole picture's size, upright
+    QImage image;      // null when the file cannot be decoded
+    QSize pictureSize; // the whole picture's size, upright
 };
 
 // Decodes the file upright (EXIF orientation applied). With a valid box the

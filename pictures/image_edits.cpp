@@ -25,8 +25,7 @@ QRgb WithChannels(QRgb pixel, int r, int g, int b)
 }
 
 // Applies f to every pixel, scanline by scanline, into a new image.
-template <typename F>
-QImage MapPixels(const QImage& image, F f)
+template <typename F> QImage MapPixels(const QImage& image, F f)
 {
     if (!IsEditable(image))
         return QImage();

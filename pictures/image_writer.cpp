@@ -16,10 +16,8 @@ struct Encoder
 };
 
 constexpr Encoder kEncoders[] = {
-    {"bmp", {"bmp", "dib", "rle", nullptr}},
-    {"jpeg", {"jpg", "jpeg", "jpe", "jfif"}},
-    {"gif", {"gif", nullptr, nullptr, nullptr}},
-    {"tiff", {"tif", "tiff", nullptr, nullptr}},
+    {"bmp", {"bmp", "dib", "rle", nullptr}},     {"jpeg", {"jpg", "jpeg", "jpe", "jfif"}},
+    {"gif", {"gif", nullptr, nullptr, nullptr}}, {"tiff", {"tif", "tiff", nullptr, nullptr}},
     {"png", {"png", nullptr, nullptr, nullptr}},
 };
 

@@ -13,7 +13,11 @@ class QPainter;
 class CPictureImage
 {
 public:
-    enum Mode { DisplayForm = 0, EditableForm = 1 };
+    enum Mode
+    {
+        DisplayForm = 0,
+        EditableForm = 1
+    };
 
     // 1 when loaded (the EXIF block is then read again); 0 after a failed load,
     // which leaves the display form. In the editable form it returns 1 at once.

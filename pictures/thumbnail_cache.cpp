@@ -55,9 +55,9 @@ QImage ReadPng(const QString& path)
 
 } // namespace
 
-CThumbnailCache::CThumbnailCache(const QString& root) : m_root(root.isEmpty() ? DefaultRoot() : root)
-{
-}
+CThumbnailCache::CThumbnailCache(const QString& root)
+    : m_root(root.isEmpty() ? DefaultRoot() : root)
+{}
 
 QString CThumbnailCache::DefaultRoot()
 {
@@ -162,8 +162,7 @@ bool CThumbnailCache::Write(Flavor flavor, const CThumbnailKey& key, const QImag
     image.setText(QStringLiteral("Thumb::MTime"), QString::number(key.mtime));
     image.setText(QStringLiteral("Thumb::Size"), QString::number(key.size));
     if (originalSize.isValid()) {
-        image.setText(QStringLiteral("Thumb::Image::Width"),
-                      QString::number(originalSize.width()));
+        image.setText(QStringLiteral("Thumb::Image::Width"), QString::number(originalSize.width()));
         image.setText(QStringLiteral("Thumb::Image::Height"),
                       QString::number(originalSize.height()));
     }

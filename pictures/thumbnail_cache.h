@@ -10,17 +10,23 @@
 
 struct CThumbnailKey
 {
-    QString path;      // absolute
-    QByteArray uri;    // file:// URI, percent-encoded
-    qint64 mtime = 0;  // seconds
-    qint64 size = 0;   // bytes
+    QString path;     // absolute
+    QByteArray uri;   // file:// URI, percent-encoded
+    qint64 mtime = 0; // seconds
+    qint64 size = 0;  // bytes
 };
 
 class CThumbnailCache
 {
 public:
     // The sizes of the cache: the longer side of a thumbnail, at most.
-    enum class Flavor { Normal, Large, XLarge, XXLarge };
+    enum class Flavor
+    {
+        Normal,
+        Large,
+        XLarge,
+        XXLarge
+    };
 
     // root is the "thumbnails" folder; DefaultRoot() when empty.
     explicit CThumbnailCache(const QString& root = QString());

@@ -17,9 +17,9 @@ CThumbnail MakeThumbnail(const QString& path, int size, const CThumbnailCache* c
         if (!result.image.isNull()) {
             // A record written by a program that kept the stored orientation.
             const QSize s = result.image.size();
-            if (result.pictureSize.isValid() && (s.width() > s.height()) !=
-                                                    (result.pictureSize.width() >
-                                                     result.pictureSize.height()) &&
+            if (result.pictureSize.isValid() &&
+                (s.width() > s.height()) !=
+                    (result.pictureSize.width() > result.pictureSize.height()) &&
                 s.width() != s.height())
                 result.pictureSize.transpose();
             if (!result.pictureSize.isValid())

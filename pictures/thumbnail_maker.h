@@ -10,7 +10,12 @@ class CThumbnailCache;
 
 struct CThumbnail
 {
-    enum Status { Ready, Failed, Missing };
+    enum Status
+    {
+        Ready,
+        Failed,
+        Missing
+    };
     Status status = Missing;
     QImage image;      // at most the requested flavor's size; null unless Ready
     QSize pictureSize; // the whole picture's size, upright (the fit rule's input)

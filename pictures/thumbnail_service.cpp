@@ -31,8 +31,8 @@ QString CThumbnailService::KeyOf(const QString& path, int size)
 {
     // One entry per disk flavor, so that cells of nearby sizes share it.
     CThumbnailCache::Flavor flavor;
-    const int edge = CThumbnailCache::FlavorFor(size, flavor) ? CThumbnailCache::FlavorSize(flavor)
-                                                              : size;
+    const int edge =
+        CThumbnailCache::FlavorFor(size, flavor) ? CThumbnailCache::FlavorSize(flavor) : size;
     return QString::number(edge) + QLatin1Char('|') + QFileInfo(path).absoluteFilePath();
 }
 

@@ -15,8 +15,8 @@ public:
         quint16 tag;
         quint16 type;
         qint32 count;
-        QByteArray value;             // in the block's byte order
-        int pointsTo = -1;            // a directory index: the value is its offset
+        QByteArray value;                           // in the block's byte order
+        int pointsTo = -1;                          // a directory index: the value is its offset
         std::optional<quint32> slot = std::nullopt; // the value/offset slot as given
     };
 
@@ -132,8 +132,8 @@ inline QByteArray ExifSegment(const QByteArray& tiff)
 // A frame header: precision 8, the size, one component.
 inline QByteArray FrameSegment(quint8 marker, int width, int height)
 {
-    const char payload[] = {8, char(height >> 8), char(height), char(width >> 8), char(width),
-                            1, 1, 0x11, 0};
+    const char payload[] = {
+        8, char(height >> 8), char(height), char(width >> 8), char(width), 1, 1, 0x11, 0};
     return JpegSegment(marker, QByteArray(payload, sizeof payload));
 }
 

@@ -69,8 +69,9 @@ inline QImage Gradient(int w, int h)
     QImage image(w, h, QImage::Format_RGB32);
     for (int y = 0; y < h; ++y) {
         for (int x = 0; x < w; ++x)
-            image.setPixel(x, y, qRgb(x * 255 / qMax(1, w - 1), y * 255 / qMax(1, h - 1),
-                                      (x + y) * 255 / qMax(1, w + h - 2)));
+            image.setPixel(x, y,
+                           qRgb(x * 255 / qMax(1, w - 1), y * 255 / qMax(1, h - 1),
+                                (x + y) * 255 / qMax(1, w + h - 2)));
     }
     return image;
 }

@@ -35,10 +35,10 @@ QStringList Fields(const CExifInfo& i)
                   i.exposureProgram, i.isoSpeed, i.exposureSpeed, i.compressionLevel,
                   i.resolutionUnit, i.exifRead})
         f << QString::number(v);
-    for (float v : {i.xResolution, i.yResolution, i.focalLength, i.exposureTime,
-                    i.shutterSpeedValue, i.fNumber, i.subjectDistance, i.exposureBias,
-                    i.focalPlaneXResolution, i.focalPlaneYResolution, i.focalPlaneResolutionUnit,
-                    i.brightness})
+    for (float v :
+         {i.xResolution, i.yResolution, i.focalLength, i.exposureTime, i.shutterSpeedValue,
+          i.fNumber, i.subjectDistance, i.exposureBias, i.focalPlaneXResolution,
+          i.focalPlaneYResolution, i.focalPlaneResolutionUnit, i.brightness})
         f << QString::number(double(v), 'g', 9);
     return f;
 }
@@ -48,19 +48,30 @@ QStringList Fields(const CExifInfo& i)
 TiffBuilder CameraBlock(bool bigEndian)
 {
     TiffBuilder t(bigEndian);
-    t.AddDirectory({t.Ascii(0x010F, "Canon"), t.Ascii(0x0110, "Canon EOS 40D"),
-                    t.Short(0x0112, 6), t.Rational(0x011A, 72, 1), t.Rational(0x011B, 300, 1),
-                    t.Short(0x0128, 3), t.Ascii(0x0131, "GIMP 2.4.5"), t.Ascii(0x013B, "Ann"),
+    t.AddDirectory({t.Ascii(0x010F, "Canon"), t.Ascii(0x0110, "Canon EOS 40D"), t.Short(0x0112, 6),
+                    t.Rational(0x011A, 72, 1), t.Rational(0x011B, 300, 1), t.Short(0x0128, 3),
+                    t.Ascii(0x0131, "GIMP 2.4.5"), t.Ascii(0x013B, "Ann"),
                     t.Ascii(0x8298, "(c) Ann"), t.Pointer(0x8769, 1)});
-    t.AddDirectory({t.Rational(0x829A, 1, 160), t.Rational(0x829D, 71, 10),
-                    t.Short(0x8822, 1), t.Short(0x8827, 400), t.Undefined(0x9000, "0221"),
-                    t.Ascii(0x9003, "2008:05:30 15:56:01"), t.Rational(0x9102, 3, 1),
-                    t.SRational(0x9201, 7, 1), t.SRational(0x9203, -1, 2),
-                    t.SRational(0x9204, -2, 3), t.Rational(0x9206, 27, 10), t.Short(0x9207, 5),
-                    t.Short(0x9209, 9), t.Rational(0x920A, 135, 1),
+    t.AddDirectory({t.Rational(0x829A, 1, 160),
+                    t.Rational(0x829D, 71, 10),
+                    t.Short(0x8822, 1),
+                    t.Short(0x8827, 400),
+                    t.Undefined(0x9000, "0221"),
+                    t.Ascii(0x9003, "2008:05:30 15:56:01"),
+                    t.Rational(0x9102, 3, 1),
+                    t.SRational(0x9201, 7, 1),
+                    t.SRational(0x9203, -1, 2),
+                    t.SRational(0x9204, -2, 3),
+                    t.Rational(0x9206, 27, 10),
+                    t.Short(0x9207, 5),
+                    t.Short(0x9209, 9),
+                    t.Rational(0x920A, 135, 1),
                     t.Undefined(0x9286, QByteArray("ASCII\0\0\0Hello there", 19)),
-                    t.Long(0xA002, 3888), t.Long(0xA003, 2592), t.Pointer(0xA005, 2),
-                    t.Rational(0xA20E, 4438, 1), t.Rational(0xA20F, 4445, 1),
+                    t.Long(0xA002, 3888),
+                    t.Long(0xA003, 2592),
+                    t.Pointer(0xA005, 2),
+                    t.Rational(0xA20E, 4438, 1),
+                    t.Rational(0xA20F, 4445, 1),
                     t.Short(0xA210, 2)});
     t.AddDirectory({t.Ascii(0x0001, "R98")});
     return t;
@@ -215,22 +226,25 @@ void TestExifReader::valuePlacement_data()
         TiffBuilder t(be);
         // Three letters and a NUL fit the entry; a longer text sits at an offset.
         t.AddDirectory({t.Ascii(0x010F, "Abc"), t.Ascii(0x0110, "Model Five")});
-        QTest::addRow("%s in entry and at offset", order)
-            << be << t.Build() << "Abc" << "Model Five";
+        QTest::addRow("%s in entry and at offset", order) << be << t.Build() << "Abc"
+                                                          << "Model Five";
 
         // Four letters without a NUL: the text ends with its own four bytes.
         TiffBuilder u(be);
         u.AddDirectory({Field{0x010F, 2, 4, "Leic"}, u.Ascii(0x0110, "M")});
-        QTest::addRow("%s unterminated in entry", order) << be << u.Build() << "Leic" << "M";
+        QTest::addRow("%s unterminated in entry", order) << be << u.Build() << "Leic"
+                                                         << "M";
 
         // Count x size decides: three SHORTs are 6 bytes, so the value sits at an offset.
         TiffBuilder w(be);
         w.AddDirectory({Field{0x010F, 3, 3, QByteArray("Sony\0\0", 6)}});
-        QTest::addRow("%s three shorts at offset", order) << be << w.Build() << "Sony" << "";
+        QTest::addRow("%s three shorts at offset", order) << be << w.Build() << "Sony"
+                                                          << "";
 
         // Make is cut at 31 bytes, model at 39.
         TiffBuilder l(be);
-        l.AddDirectory({l.Ascii(0x010F, QByteArray(40, 'a')), l.Ascii(0x0110, QByteArray(45, 'b'))});
+        l.AddDirectory(
+            {l.Ascii(0x010F, QByteArray(40, 'a')), l.Ascii(0x0110, QByteArray(45, 'b'))});
         QTest::addRow("%s long texts cut", order)
             << be << l.Build() << QString(31, 'a') << QString(39, 'b');
     }
@@ -253,8 +267,7 @@ void TestExifReader::userComment_data()
     QTest::addColumn<QString>("shown");
     QTest::newRow("ascii") << QByteArray("ASCII\0\0\0Holiday at sea", 22) << "Holiday at sea";
     QTest::newRow("unicode shows its code") << QByteArray("UNICODE\0H\0i\0", 12) << "UNICODE";
-    QTest::newRow("undefined code is empty")
-        << QByteArray("\0\0\0\0\0\0\0\0text", 12) << "";
+    QTest::newRow("undefined code is empty") << QByteArray("\0\0\0\0\0\0\0\0text", 12) << "";
     QTest::newRow("ascii, 100 bytes at most")
         << (QByteArray("ASCII\0\0\0", 8) + QByteArray(120, 'x')) << QString(92, 'x');
     QTest::newRow("too short for its code") << QByteArray("ASCI", 4) << "ASCI";
@@ -303,7 +316,8 @@ void TestExifReader::directoryBounds_data()
 
     TiffBuilder negative(false);
     negative.AddDirectory({negative.Slot(0x8769, 4, 1, 4), negative.Short(0x8827, 50)});
-    QTest::newRow("negative pointer skips only that directory") << negative.Build() << 1 << 50 << "";
+    QTest::newRow("negative pointer skips only that directory")
+        << negative.Build() << 1 << 50 << "";
 
     TiffBuilder beyond(false);
     beyond.AddDirectory({beyond.Slot(0x8769, 4, 1, 100000), beyond.Short(0x8827, 64)});
@@ -314,8 +328,8 @@ void TestExifReader::directoryBounds_data()
     QTest::newRow("first directory before the data") << firstNegative.Build(2) << 0 << 0 << "";
 
     TiffBuilder badType(false);
-    badType.AddDirectory({badType.Ascii(0x010F, "Kept"), Field{0x8827, 13, 1, "\x10\0"},
-                          badType.Short(0x8827, 99)});
+    badType.AddDirectory(
+        {badType.Ascii(0x010F, "Kept"), Field{0x8827, 13, 1, "\x10\0"}, badType.Short(0x8827, 99)});
     QTest::newRow("type above 12 abandons the directory") << badType.Build() << 0 << 0 << "Kept";
 
     TiffBuilder subBadType(false);
@@ -324,8 +338,8 @@ void TestExifReader::directoryBounds_data()
     QTest::newRow("bad sub-directory, parent goes on") << subBadType.Build() << 1 << 0 << "After";
 
     TiffBuilder valueOutside(true);
-    valueOutside.AddDirectory({valueOutside.Slot(0x010F, 2, 20, 5000),
-                               valueOutside.Short(0x8827, 12)});
+    valueOutside.AddDirectory(
+        {valueOutside.Slot(0x010F, 2, 20, 5000), valueOutside.Short(0x8827, 12)});
     QTest::newRow("value past the end abandons the directory")
         << valueOutside.Build() << 0 << 0 << "";
 
@@ -378,8 +392,7 @@ void TestExifReader::numericValue_data()
     QTest::newRow("RATIONAL 4294967295/1")
         << 5 << QByteArray("\xFF\xFF\xFF\xFF\0\0\0\x01", 8) << 4294967296.0f;
     QTest::newRow("SRATIONAL -3/2") << 10 << QByteArray("\xFF\xFF\xFF\xFD\0\0\0\x02", 8) << -1.5f;
-    QTest::newRow("SRATIONAL 1/-4") << 10 << QByteArray("\0\0\0\x01\xFF\xFF\xFF\xFC", 8)
-                                    << -0.25f;
+    QTest::newRow("SRATIONAL 1/-4") << 10 << QByteArray("\0\0\0\x01\xFF\xFF\xFF\xFC", 8) << -0.25f;
     QTest::newRow("ASCII") << 2 << QByteArray("1234", 4) << 0.0f;
     QTest::newRow("UNDEFINED") << 7 << QByteArray("\x01\x02", 2) << 0.0f;
     QTest::newRow("FLOAT") << 11 << QByteArray("\x3F\x80\0\0", 4) << 0.0f;
@@ -421,14 +434,14 @@ void TestExifReader::segmentWalk_data()
         << Jpeg({FrameSegment(0xC0, 640, 480), exif}) << 1 << 4000 << 3000 << 1;
     QTest::newRow("not a JPEG stream") << QByteArray("\x89PNG\r\n\x1a\n", 8) << 0 << 0 << 0 << 0;
     QTest::newRow("empty") << QByteArray() << 0 << 0 << 0 << 0;
-    QTest::newRow("six fill bytes") << (QByteArray("\xFF\xD8") + QByteArray(5, '\xFF') +
-                                        FrameSegment(0xC0, 10, 20))
-                                    << 1 << 10 << 20 << 0;
-    QTest::newRow("seven fill bytes") << (QByteArray("\xFF\xD8") + QByteArray(6, '\xFF') +
-                                          FrameSegment(0xC0, 10, 20))
-                                      << 0 << 0 << 0 << 0;
-    QTest::newRow("fill bytes to the end") << QByteArray("\xFF\xD8\xFF\xFF\xFF", 5) << 1 << 0
-                                           << 0 << 0;
+    QTest::newRow("six fill bytes")
+        << (QByteArray("\xFF\xD8") + QByteArray(5, '\xFF') + FrameSegment(0xC0, 10, 20)) << 1 << 10
+        << 20 << 0;
+    QTest::newRow("seven fill bytes")
+        << (QByteArray("\xFF\xD8") + QByteArray(6, '\xFF') + FrameSegment(0xC0, 10, 20)) << 0 << 0
+        << 0 << 0;
+    QTest::newRow("fill bytes to the end")
+        << QByteArray("\xFF\xD8\xFF\xFF\xFF", 5) << 1 << 0 << 0 << 0;
     QTest::newRow("APP1 that is not EXIF")
         << Jpeg({JpegSegment(0xE1, "http://ns.adobe.com/xap/1.0/\0<x/>")}) << 1 << 0 << 0 << 0;
     QTest::newRow("APP1 EXIF cut by the end of the file")
@@ -443,8 +456,8 @@ void TestExifReader::segmentWalk_data()
     QList<QByteArray> nineteen(19, JpegSegment(0xE2, "ICC"));
     QTest::newRow("frame header as 20th segment")
         << Jpeg(nineteen + QList<QByteArray>{FrameSegment(0xC0, 64, 48)}) << 1 << 64 << 48 << 0;
-    QTest::newRow("zero segment length") << QByteArray("\xFF\xD8\xFF\xE0\0\0\xFF\xC0", 8) << 1
-                                         << 0 << 0 << 0;
+    QTest::newRow("zero segment length")
+        << QByteArray("\xFF\xD8\xFF\xE0\0\0\xFF\xC0", 8) << 1 << 0 << 0 << 0;
     QTest::newRow("EXIF segment too short for a block")
         << Jpeg({JpegSegment(0xE1, QByteArray("Exif", 4))}) << 1 << 0 << 0 << 0;
 }

@@ -127,8 +127,8 @@ void TestExifReport::exposureTime_data()
     QTest::newRow("1/3 rounds to 1/3") << (1.0f / 3) << 0.0f << "Exposure time:\t0.333 (1/3)";
     QTest::newRow("long exposure") << 30.0f << 0.0f << "Exposure time:\t30.000 (1/0)";
     QTest::newRow("1/8000") << 0.000125f << 0.0f << "Exposure time:\t0.000 (1/8000)";
-    QTest::newRow("shutter speed beyond float") << 0.0f << 200.0f
-                                                << "Exposure time:\t0.000 (1/2147483647)";
+    QTest::newRow("shutter speed beyond float")
+        << 0.0f << 200.0f << "Exposure time:\t0.000 (1/2147483647)";
 }
 
 void TestExifReport::exposureTime()
@@ -173,36 +173,51 @@ void TestExifReport::optionalLines_data()
     QTest::addColumn<int>("value");
     QTest::addColumn<QString>("line"); // empty: no line starting with the head
     QTest::addColumn<QString>("head");
-    const QStringList programs = {"Manual",           "Normal Program",  "Aperture priority",
+    const QStringList programs = {"Manual",           "Normal Program",   "Aperture priority",
                                   "Shutter priority", "Creative program", "Action program",
                                   "Portrait mode",    "Landscape mode"};
     for (int p = 0; p <= 9; ++p) {
         const QString text = p >= 1 && p <= 8 ? "Exposure program:\t" + programs.at(p - 1) : "";
         QTest::addRow("program %d", p) << "program" << p << text << "Exposure program:";
     }
-    const QStringList modes = {"Average", "Center Weighted Average", "Spot", "Multispot",
-                               "Pattern", "Partial"};
+    const QStringList modes = {"Average", "Center Weighted Average", "Spot", "Multispot", "Pattern",
+                               "Partial"};
     for (int m : {0, 1, 2, 3, 4, 5, 6, 7, 255}) {
         const QString text = m >= 1 && m <= 6 ? "Metering mode:\t" + modes.at(m - 1) : "";
         QTest::addRow("metering %d", m) << "metering" << m << text << "Metering mode:";
     }
-    QTest::newRow("compression 0") << "compression" << 0 << "" << "Compression Level:";
-    QTest::newRow("compression -2") << "compression" << -2 << "" << "Compression Level:";
+    QTest::newRow("compression 0") << "compression" << 0 << ""
+                                   << "Compression Level:";
+    QTest::newRow("compression -2") << "compression" << -2 << ""
+                                    << "Compression Level:";
     QTest::newRow("compression 2") << "compression" << 2 << "Compression Level:\t2"
                                    << "Compression Level:";
-    QTest::newRow("distance 0") << "distance" << 0 << "" << "Distance:";
-    QTest::newRow("distance 0.5 shows 0") << "distance" << 5 << "Distance:\t\t0" << "Distance:";
-    QTest::newRow("distance 2.9 shows 2") << "distance" << 29 << "Distance:\t\t2" << "Distance:";
-    QTest::newRow("flash 0") << "flash" << 0 << "Flash Used:\tNo" << "Flash Used:";
-    QTest::newRow("flash 1") << "flash" << 1 << "Flash Used:\tYes" << "Flash Used:";
-    QTest::newRow("artist") << "artist" << 1 << "Artist:\t\tA" << "Artist:";
-    QTest::newRow("no artist") << "artist" << 0 << "" << "Artist:";
-    QTest::newRow("copyright") << "copyright" << 1 << "Copyright:\t\tA" << "Copyright:";
-    QTest::newRow("no copyright") << "copyright" << 0 << "" << "Copyright:";
-    QTest::newRow("software") << "software" << 1 << "Software:\t\tA" << "Software:";
-    QTest::newRow("no software") << "software" << 0 << "" << "Software:";
-    QTest::newRow("comments") << "comments" << 1 << "Comments:\tA" << "Comments:";
-    QTest::newRow("no comments") << "comments" << 0 << "" << "Comments:";
+    QTest::newRow("distance 0") << "distance" << 0 << ""
+                                << "Distance:";
+    QTest::newRow("distance 0.5 shows 0") << "distance" << 5 << "Distance:\t\t0"
+                                          << "Distance:";
+    QTest::newRow("distance 2.9 shows 2") << "distance" << 29 << "Distance:\t\t2"
+                                          << "Distance:";
+    QTest::newRow("flash 0") << "flash" << 0 << "Flash Used:\tNo"
+                             << "Flash Used:";
+    QTest::newRow("flash 1") << "flash" << 1 << "Flash Used:\tYes"
+                             << "Flash Used:";
+    QTest::newRow("artist") << "artist" << 1 << "Artist:\t\tA"
+                            << "Artist:";
+    QTest::newRow("no artist") << "artist" << 0 << ""
+                               << "Artist:";
+    QTest::newRow("copyright") << "copyright" << 1 << "Copyright:\t\tA"
+                               << "Copyright:";
+    QTest::newRow("no copyright") << "copyright" << 0 << ""
+                                  << "Copyright:";
+    QTest::newRow("software") << "software" << 1 << "Software:\t\tA"
+                              << "Software:";
+    QTest::newRow("no software") << "software" << 0 << ""
+                                 << "Software:";
+    QTest::newRow("comments") << "comments" << 1 << "Comments:\tA"
+                              << "Comments:";
+    QTest::newRow("no comments") << "comments" << 0 << ""
+                                 << "Comments:";
 }
 
 void TestExifReport::optionalLines()

@@ -140,19 +140,20 @@ void TestPictureImage::fitRule_data()
     QTest::addColumn<bool>("fit");
     QTest::addColumn<QRect>("expected");
     const QRect cell(0, 0, 214, 160);
-    QTest::newRow("400x300 shrinks to 200x150") << QSize(400, 300) << cell << true
-                                               << QRect(7, 5, 200, 150);
-    QTest::newRow("50x20 grows to 200x80") << QSize(50, 20) << cell << true << QRect(7, 40, 200, 80);
-    QTest::newRow("1x1000: width 0 becomes 2") << QSize(1, 1000) << QRect(0, 0, 100, 100) << true
-                                               << QRect(49, 5, 2, 90);
-    QTest::newRow("offset target, odd height") << QSize(300, 100) << QRect(100, 50, 114, 60)
-                                               << true << QRect(107, 64, 100, 32);
-    QTest::newRow("target smaller than the frame loss") << QSize(40, 30) << QRect(0, 0, 10, 8)
-                                                        << true << QRect(4, 3, 2, 2);
-    QTest::newRow("natural size, centred") << QSize(400, 300) << cell << false
-                                           << QRect(-93, -70, 400, 300);
-    QTest::newRow("natural size, odd sides lose a pixel") << QSize(5, 3) << QRect(10, 20, 100, 50)
-                                                          << false << QRect(58, 44, 4, 2);
+    QTest::newRow("400x300 shrinks to 200x150")
+        << QSize(400, 300) << cell << true << QRect(7, 5, 200, 150);
+    QTest::newRow("50x20 grows to 200x80")
+        << QSize(50, 20) << cell << true << QRect(7, 40, 200, 80);
+    QTest::newRow("1x1000: width 0 becomes 2")
+        << QSize(1, 1000) << QRect(0, 0, 100, 100) << true << QRect(49, 5, 2, 90);
+    QTest::newRow("offset target, odd height")
+        << QSize(300, 100) << QRect(100, 50, 114, 60) << true << QRect(107, 64, 100, 32);
+    QTest::newRow("target smaller than the frame loss")
+        << QSize(40, 30) << QRect(0, 0, 10, 8) << true << QRect(4, 3, 2, 2);
+    QTest::newRow("natural size, centred")
+        << QSize(400, 300) << cell << false << QRect(-93, -70, 400, 300);
+    QTest::newRow("natural size, odd sides lose a pixel")
+        << QSize(5, 3) << QRect(10, 20, 100, 50) << false << QRect(58, 44, 4, 2);
 }
 
 void TestPictureImage::fitRule()
@@ -277,14 +278,14 @@ void TestPictureImage::contrast_data()
     // Means: 127 dark, 128 light, (200 + 10 + 170) / 3 = 126 dark, (0,0,255) = 85 dark.
     const QList<QRgb> pixels = {qRgb(127, 127, 127), qRgb(128, 128, 128), qRgb(200, 10, 170),
                                 qRgb(0, 0, 255),     qRgb(255, 255, 255), qRgb(0, 0, 0)};
-    QTest::newRow("more contrast") << true << 20 << pixels
-                                   << QList<QRgb>{qRgb(107, 107, 107), qRgb(148, 148, 148),
-                                                  qRgb(180, 0, 150), qRgb(0, 0, 235),
-                                                  qRgb(255, 255, 255), qRgb(0, 0, 0)};
-    QTest::newRow("less contrast") << false << 20 << pixels
-                                   << QList<QRgb>{qRgb(147, 147, 147), qRgb(108, 108, 108),
-                                                  qRgb(220, 30, 190), qRgb(20, 20, 255),
-                                                  qRgb(235, 235, 235), qRgb(20, 20, 20)};
+    QTest::newRow("more contrast")
+        << true << 20 << pixels
+        << QList<QRgb>{qRgb(107, 107, 107), qRgb(148, 148, 148), qRgb(180, 0, 150),
+                       qRgb(0, 0, 235),     qRgb(255, 255, 255), qRgb(0, 0, 0)};
+    QTest::newRow("less contrast")
+        << false << 20 << pixels
+        << QList<QRgb>{qRgb(147, 147, 147), qRgb(108, 108, 108), qRgb(220, 30, 190),
+                       qRgb(20, 20, 255),   qRgb(235, 235, 235), qRgb(20, 20, 20)};
 }
 
 void TestPictureImage::contrast()
@@ -318,8 +319,10 @@ void TestPictureImage::scaleAveragesAreas()
     QCOMPARE(item->ScaleImage(2, 1), 1);
     const QImage small = Working(*item, m_dir);
     QCOMPARE(small.size(), QSize(2, 1));
-    QVERIFY2(qAbs(qRed(small.pixel(0, 0)) - 100) <= 2, qPrintable(QString::number(small.pixel(0, 0), 16)));
-    QVERIFY2(qAbs(qRed(small.pixel(1, 0)) - 155) <= 2, qPrintable(QString::number(small.pixel(1, 0), 16)));
+    QVERIFY2(qAbs(qRed(small.pixel(0, 0)) - 100) <= 2,
+             qPrintable(QString::number(small.pixel(0, 0), 16)));
+    QVERIFY2(qAbs(qRed(small.pixel(1, 0)) - 155) <= 2,
+             qPrintable(QString::number(small.pixel(1, 0), 16)));
     QCOMPARE(item->ScaleImage(0, 5), 0);
     QCOMPARE(item->ScaleImage(20000, 20000), 0); // 400 megapixels
     QCOMPARE(item->GetImageWidth(), 2);
@@ -432,15 +435,24 @@ void TestPictureImage::saveByExtension_data()
     QTest::addColumn<QString>("format");
     QTest::addColumn<double>("tolerance");
     // Sharp colour edges cost JPEG a few levels (chroma is halved).
-    QTest::newRow("jpg") << "out.jpg" << "JPEG" << 6.0;
-    QTest::newRow("JPG upper case") << "OUT2.JPG" << "JPEG" << 6.0;
-    QTest::newRow("jpeg") << "out.jpeg" << "JPEG" << 6.0;
-    QTest::newRow("png") << "out.png" << "PNG" << 0.0;
-    QTest::newRow("Png mixed case") << "out2.Png" << "PNG" << 0.0;
-    QTest::newRow("bmp") << "out.bmp" << "BMP" << 0.0;
-    QTest::newRow("gif") << "out.gif" << "GIF" << 0.0;
-    QTest::newRow("GIF upper case") << "out2.GIF" << "GIF" << 0.0;
-    QTest::newRow("dots in the folder name") << "a.b/out" << "" << 0.0;
+    QTest::newRow("jpg") << "out.jpg"
+                         << "JPEG" << 6.0;
+    QTest::newRow("JPG upper case") << "OUT2.JPG"
+                                    << "JPEG" << 6.0;
+    QTest::newRow("jpeg") << "out.jpeg"
+                          << "JPEG" << 6.0;
+    QTest::newRow("png") << "out.png"
+                         << "PNG" << 0.0;
+    QTest::newRow("Png mixed case") << "out2.Png"
+                                    << "PNG" << 0.0;
+    QTest::newRow("bmp") << "out.bmp"
+                         << "BMP" << 0.0;
+    QTest::newRow("gif") << "out.gif"
+                         << "GIF" << 0.0;
+    QTest::newRow("GIF upper case") << "out2.GIF"
+                                    << "GIF" << 0.0;
+    QTest::newRow("dots in the folder name") << "a.b/out"
+                                             << "" << 0.0;
 }
 
 void TestPictureImage::saveByExtension()

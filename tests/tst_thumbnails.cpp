@@ -82,10 +82,11 @@ void TestThumbnails::fileUri_data()
     QTest::addColumn<QByteArray>("uri");
     QTest::addColumn<QString>("hash");
     // The freedesktop thumbnail specification's own example.
-    QTest::newRow("plain") << "/home/jens/photos/me.png" << QByteArray("file:///home/jens/photos/me.png")
+    QTest::newRow("plain") << "/home/jens/photos/me.png"
+                           << QByteArray("file:///home/jens/photos/me.png")
                            << "c6ee772d9e49320e97ec29a7eb5b1697.png";
-    QTest::newRow("blank and umlaut") << "/tmp/a b/\u00fc.jpg"
-                                      << QByteArray("file:///tmp/a%20b/%C3%BC.jpg") << "";
+    QTest::newRow("blank and umlaut")
+        << "/tmp/a b/\u00fc.jpg" << QByteArray("file:///tmp/a%20b/%C3%BC.jpg") << "";
     QTest::newRow("reserved characters")
         << "/x/#1?%[]^;.jpg" << QByteArray("file:///x/%231%3F%25%5B%5D%5E%3B.jpg") << "";
     QTest::newRow("characters left alone")
@@ -216,8 +217,8 @@ void TestThumbnails::orientationAndReducedDecode()
     QCOMPARE(made.status, CThumbnail::Ready);
     QCOMPARE(made.image.size(), expected.size());
     QCOMPARE(made.pictureSize, name.startsWith("landscape") ? QSize(600, 450) : QSize(450, 600));
-    const double difference = MeanDifference(made.image.convertToFormat(QImage::Format_RGB32),
-                                             expected);
+    const double difference =
+        MeanDifference(made.image.convertToFormat(QImage::Format_RGB32), expected);
     // Resampling differs (about 5 levels); a wrong turn or mirror differs by 40 or more.
     QVERIFY2(difference >= 0 && difference < 10.0, qPrintable(QString::number(difference)));
 }
@@ -270,8 +271,8 @@ void TestThumbnails::invalidateForgetsEverything()
     const QString picture = WriteJpeg(m_dir->filePath("edit.jpg"), Gradient(400, 300));
     CThumbnailService service(m_root);
     QCOMPARE(service.Make(picture, 128).image.size(), QSize(128, 96));
-    const QString stored = service.GetDiskCache().ThumbnailPath(
-        CThumbnailCache::Flavor::Normal, CThumbnailCache::FileUri(picture));
+    const QString stored = service.GetDiskCache().ThumbnailPath(CThumbnailCache::Flavor::Normal,
+                                                                CThumbnailCache::FileUri(picture));
     QVERIFY(QFileInfo::exists(stored));
     // The picture is rewritten within the same second: only Invalidate can tell.
     const qint64 mtime = MTime(picture);
