@@ -33,6 +33,12 @@ CPictureItem::CPictureItem(const CDocumentItem& document)
     m_updateDate = CTime::GetCurrentTime();
 }
 
+CPictureItem::CPictureItem(const CPictureItem& other)
+    : CDocumentItem(other), m_displayCaption(other.m_displayCaption),
+      m_fitToFrame(other.m_fitToFrame), m_whiteBorder(other.m_whiteBorder)
+{
+}
+
 CPictureItem::~CPictureItem() = default;
 
 CPictureImage& CPictureItem::Image()

@@ -21,6 +21,9 @@ public:
     // Takes the file, caption, categories, dates, keywords and sequence number
     // of a document; the update date is now and the document number stays 0.
     explicit CPictureItem(const CDocumentItem& document);
+    // Every stored field and the drawing flags; the decoded picture is not
+    // copied (the copy decodes its file when first used).
+    CPictureItem(const CPictureItem& other);
     ~CPictureItem() override;
 
     bool IsPicture() const override { return true; }

@@ -121,6 +121,7 @@ private slots:
     void decodeLimits_data();
     void decodeLimits();
     void loadReadsExif();
+    void copyLeavesTheDecodedPicture();
 
 private:
     QTemporaryDir m_dir;
@@ -595,6 +596,22 @@ void TestPictureImage::loadReadsExif()
     QCOMPARE(loaded.LoadImage(CPictureItem::kDisplayForm), 1);
     QCOMPARE(loaded.GetExifRead(), 1);
     QCOMPARE(loaded.GetExifInfo().cameraModel, std::string("Canon EOS 40D"));
+}
+
+void TestPictureImage::copyLeavesTheDecodedPicture()
+{
+    auto item = Editable(WritePng(m_dir, "copied.png", Gradient(8, 4)));
+    QVERIFY(item);
+    item->SetLabel("copied");
+    item->SetWhiteBorder(1);
+    QCOMPARE(item->RotateImage(), 1);
+    CPictureItem copy(*item);
+    QCOMPARE(copy.GetLabel(), std::string("copied"));
+    QCOMPARE(copy.GetWhiteBorder(), 1);
+    QCOMPARE(copy.GetImageMode(), int(CPictureItem::kDisplayForm));
+    QCOMPARE(copy.IsImageEdited(), false);
+    QCOMPARE(copy.GetImageWidth(), 8); // its own decoding of the file
+    QCOMPARE(item->GetImageWidth(), 4);
 }
 
 QTEST_MAIN(TestPictureImage)
