@@ -14,79 +14,19 @@
 
 namespace {
 
-QString WritePng(const QTemporaryDir& dir, const QString& name, const QImage& image)
+QString WriteFile(const QString& path, const QByteArray& bytes)
 {
-    const QString path = dir.filePath(name);
-    return image.save(path, "PNG") ? path : QString();
+    QFile file(path);
+    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() ? path : QString();
 }
 
-std::unique_ptr<CPictureItem> Editable(const QString& path)
+// The pixel at (x, y) of a one-row picture made of the given colours.
+QImage Row(const QList<QRgb>& pixels)
 {
-    auto item = std::make_unique<CPictureItem>();
-    item->SetPathname(path.toStdString());
-    if (!item->LoadImage(CPictureItem::kEditableForm))
-        return nullptr;
-    return item;
-}
-
-// The working image, as a saved PNG decoded again by ImageMagick.
-QImage Working(CPictureItem& item, const QTemporaryDir& dir)
-{
-    static int n = 0;
-    const QString path = dir.filePath(QStringLiteral("working-%1.png").arg(++n));
-    if (!item.SaveImageAs(path.toStdString()))
-        return QImage();
-    return MagickPixels(path);
-}
-
-// Six distinct pixels, 3 wide and 2 high: (x, y) has red 10x + 1, green 10y + 2.
-QImage SixPixels()
-{
-    QImage image(3, 2, QImage::Format_RGB32);
-    for (int y = 0; y < 2; ++y) {
-        for (int x = 0; x < 3; ++x)
-            image.setPixel(x, y, qRgb(10 * x + 1, 10 * y + 2, 77));
-    }
+    QImage image(int(pixels.size()), 1, QImage::Format_RGB32);
+    for (int x = 0; x < pixels.size(); ++x)
+        image.setPixel(x, 0, pixels.at(x));
     return image;
-}
-
-quint32 Crc32(const QByteArray& bytes)
-{
-    quint32 crc = 0xFFFFFFFF;
-    for (char c : bytes) {
-        crc ^= quint8(c);
-        for (int k = 0; k < 8; ++k)
-            crc = (crc >> 1) ^ (0xEDB88320 & (0 - (crc & 1)));
-    }
-    return ~crc;
-}
-
-QByteArray PngChunk(const char* type, const QByteArray& data)
-{
-    QByteArray chunk;
-    const auto be32 = [](quint32 v) {
-        const char bytes[4] = {char(v >> 24), char(v >> 16), char(v >> 8), char(v)};
-        return QByteArray(bytes, 4);
-    };
-    chunk += be32(quint32(data.size())) + type + data;
-    chunk += be32(Crc32(QByteArray(type) + data));
-    return chunk;
-}
-
-// A PNG whose header claims width x height; its data is one tiny stream.
-QByteArray PngClaiming(quint32 width, quint32 height, char bitDepth, char colorType)
-{
-    QByteArray header;
-    for (quint32 v : {width, height}) {
-        for (int s = 24; s >= 0; s -= 8)
-            header += char(v >> s);
-    }
-    header += bitDepth;
-    header += colorType;
-    header += QByteArray(3, '\0');
-    return QByteArray("\x89PNG\r\n\x1a\n", 8) + PngChunk("IHDR", header) +
-           PngChunk("IDAT", QByteArray("\x78\x9c\x03\x00\x00\x00\x00\x01", 8)) +
-           PngChunk("IEND", QByteArray());
 }
 
 } // namespace
@@ -101,9 +41,7 @@ private slots:
     void fitRule();
     void drawFitsAndMats();
     void rotation();
-    void rotateFourTimesIsIdentity();
     void brightness();
-    void brightnessStartsFromTheLoadedPicture();
     void contrast_data();
     void contrast();
     void scaleAveragesAreas();
@@ -111,26 +49,45 @@ private slots:
     void crop();
     void editsNeedTheEditableForm();
     void revertAndCommit();
-    void failedCommitKeepsEdits();
     void saveByExtension_data();
     void saveByExtension();
-    void gifOfManyColours();
-    void gifKeepsTransparency();
-    void unknownExtensionWritesNothing_data();
-    void unknownExtensionWritesNothing();
-    void decodeLimits_data();
-    void decodeLimits();
+    void gifPalette();
+    void decodeLimit();
     void loadReadsExif();
-    void copyLeavesTheDecodedPicture();
 
 private:
+    QString Png(const QImage& image);
+    std::unique_ptr<CPictureItem> Editable(const QImage& image);
+    // The working image, saved as PNG and decoded again by ImageMagick.
+    QImage Working(CPictureItem& item);
+
     QTemporaryDir m_dir;
+    int m_files = 0;
 };
+
+QString TestPictureImage::Png(const QImage& image)
+{
+    const QString path = m_dir.filePath(QStringLiteral("picture-%1.png").arg(++m_files));
+    return image.save(path, "PNG") ? path : QString();
+}
+
+std::unique_ptr<CPictureItem> TestPictureImage::Editable(const QImage& image)
+{
+    auto item = std::make_unique<CPictureItem>();
+    item->SetPathname(Png(image).toStdString());
+    return item->LoadImage(CPictureItem::kEditableForm) ? std::move(item) : nullptr;
+}
+
+QImage TestPictureImage::Working(CPictureItem& item)
+{
+    const QString path = m_dir.filePath(QStringLiteral("working-%1.png").arg(++m_files));
+    return item.SaveImageAs(path.toStdString()) ? MagickPixels(path) : QImage();
+}
 
 void TestPictureImage::initTestCase()
 {
     QVERIFY(m_dir.isValid());
-    if (Identify(WritePng(m_dir, "probe.png", SixPixels())) != QLatin1String("PNG 3 2"))
+    if (Identify(Png(Gradient(3, 2))) != QLatin1String("PNG 3 2"))
         QSKIP("ImageMagick (identify, convert) is needed as the independent decoder");
 }
 
@@ -171,137 +128,101 @@ void TestPictureImage::drawFitsAndMats()
     QImage red(400, 300, QImage::Format_RGB32);
     red.fill(qRgb(255, 0, 0));
     CPictureItem item;
-    item.SetPathname(WritePng(m_dir, "red.png", red).toStdString());
+    item.SetPathname(Png(red).toStdString());
+    const QRgb blue = qRgb(0, 0, 255), white = qRgb(255, 255, 255);
     for (bool mat : {false, true}) {
         QImage canvas(214, 160, QImage::Format_RGB32);
-        canvas.fill(qRgb(0, 0, 255));
+        canvas.fill(blue);
         item.SetWhiteBorder(mat);
-        {
-            QPainter painter(&canvas);
-            QCOMPARE(item.Draw(painter, QRect(0, 0, 214, 160)), 1);
-        }
-        // The fitted rectangle is (7, 5) to (207, 155); the mat is 8 pixels wide.
-        QCOMPARE(canvas.pixel(6, 80), qRgb(0, 0, 255));
-        QCOMPARE(canvas.pixel(207, 80), qRgb(0, 0, 255));
-        QCOMPARE(canvas.pixel(100, 4), qRgb(0, 0, 255));
-        QCOMPARE(canvas.pixel(100, 155), qRgb(0, 0, 255));
-        QCOMPARE(canvas.pixel(7, 5), mat ? qRgb(255, 255, 255) : qRgb(255, 0, 0));
-        QCOMPARE(canvas.pixel(14, 80), mat ? qRgb(255, 255, 255) : qRgb(255, 0, 0));
+        QPainter painter(&canvas);
+        QCOMPARE(item.Draw(painter, QRect(0, 0, 214, 160)), 1);
+        painter.end();
+        // Fitted to (7, 5)-(207, 155); the mat is the outer 8 pixels of it.
+        for (QPoint outside : {QPoint(6, 80), QPoint(207, 80), QPoint(100, 4), QPoint(100, 155)})
+            QCOMPARE(canvas.pixel(outside), blue);
+        for (QPoint rim : {QPoint(7, 5), QPoint(14, 80), QPoint(199, 146)})
+            QCOMPARE(canvas.pixel(rim), mat ? white : qRgb(255, 0, 0));
         QCOMPARE(canvas.pixel(15, 80), qRgb(255, 0, 0));
         QCOMPARE(canvas.pixel(198, 146), qRgb(255, 0, 0));
-        QCOMPARE(canvas.pixel(199, 146), mat ? qRgb(255, 255, 255) : qRgb(255, 0, 0));
-        QCOMPARE(item.GetImageMode(), int(CPictureItem::kDisplayForm));
     }
-    QCOMPARE(item.GetImageWidth(), 400);
+    QCOMPARE(item.GetImageMode(), int(CPictureItem::kDisplayForm));
 
     CPictureItem broken;
-    QFile junk(m_dir.filePath("junk.jpg"));
-    QVERIFY(junk.open(QIODevice::WriteOnly));
-    junk.write("\xFF\xD8 not really a picture");
-    junk.close();
-    broken.SetPathname(junk.fileName().toStdString());
+    broken.SetPathname(
+        WriteFile(m_dir.filePath("junk.jpg"), "\xFF\xD8 not a picture").toStdString());
     QImage canvas(50, 50, QImage::Format_RGB32);
-    canvas.fill(Qt::black);
     QPainter painter(&canvas);
     QCOMPARE(broken.Draw(painter, QRect(0, 0, 50, 50)), 0);
     QCOMPARE(broken.GetImageWidth(), 0);
     QCOMPARE(broken.LoadImage(CPictureItem::kDisplayForm), 0);
-    painter.end();
-    QCOMPARE(canvas.pixel(25, 25), qRgb(0, 0, 0));
 }
 
 void TestPictureImage::rotation()
 {
-    auto item = Editable(WritePng(m_dir, "six.png", SixPixels()));
+    // (x, y) of a 3 x 2 picture has red 10x + 1, green 10y + 2.
+    QImage six(3, 2, QImage::Format_RGB32);
+    for (int y = 0; y < 2; ++y) {
+        for (int x = 0; x < 3; ++x)
+            six.setPixel(x, y, qRgb(10 * x + 1, 10 * y + 2, 77));
+    }
+    auto item = Editable(six);
     QVERIFY(item);
     QCOMPARE(item->RotateImage(), 1);
     QCOMPARE(item->GetImageWidth(), 2);
-    QCOMPARE(item->GetImageHeight(), 3);
-    const QImage turned = Working(*item, m_dir);
+    const QImage turned = Working(*item);
     QCOMPARE(turned.size(), QSize(2, 3));
-    // A quarter turn clockwise: source (x, y) lands on (H - 1 - y, x), with H = 2.
+    // A quarter turn clockwise: (x, y) lands on (H - 1 - y, x), with H = 2.
     for (int y = 0; y < 2; ++y) {
         for (int x = 0; x < 3; ++x)
-            QCOMPARE(turned.pixel(1 - y, x), qRgb(10 * x + 1, 10 * y + 2, 77));
+            QCOMPARE(turned.pixel(1 - y, x), six.pixel(x, y));
     }
-}
-
-void TestPictureImage::rotateFourTimesIsIdentity()
-{
-    const QImage original = Gradient(37, 23);
-    auto item = Editable(WritePng(m_dir, "turn.png", original));
-    QVERIFY(item);
+    const QImage odd = Gradient(37, 23);
+    auto four = Editable(odd);
     for (int k = 0; k < 4; ++k)
-        QCOMPARE(item->RotateImage(), 1);
-    QCOMPARE(MeanDifference(Working(*item, m_dir), original), 0.0);
+        QCOMPARE(four->RotateImage(), 1);
+    QCOMPARE(MeanDifference(Working(*four), odd), 0.0);
 }
 
 void TestPictureImage::brightness()
 {
-    QImage image(2, 1, QImage::Format_RGB32);
-    image.setPixel(0, 0, qRgb(10, 250, 128));
-    image.setPixel(1, 0, qRgb(0, 40, 255));
-    auto item = Editable(WritePng(m_dir, "bright.png", image));
+    auto item = Editable(Row({qRgb(10, 250, 128), qRgb(0, 40, 255)}));
     QVERIFY(item);
     QCOMPARE(item->AdjustBrightness(false, 40), 1);
-    QImage once = Working(*item, m_dir);
+    const QImage once = Working(*item);
     QCOMPARE(once.pixel(0, 0), qRgb(50, 255, 168));
     QCOMPARE(once.pixel(1, 0), qRgb(40, 80, 255));
+    // Each step starts from the picture as loaded, a rotation included.
+    QCOMPARE(item->RotateImage(), 1);
     QCOMPARE(item->AdjustBrightness(false, 40), 1);
-    QCOMPARE(MeanDifference(Working(*item, m_dir), once), 0.0);
+    QCOMPARE(MeanDifference(Working(*item), once), 0.0);
     QCOMPARE(item->AdjustBrightness(true, 40), 1);
-    const QImage darker = Working(*item, m_dir);
+    const QImage darker = Working(*item);
     QCOMPARE(darker.pixel(0, 0), qRgb(0, 210, 88));
     QCOMPARE(darker.pixel(1, 0), qRgb(0, 0, 215));
-}
-
-void TestPictureImage::brightnessStartsFromTheLoadedPicture()
-{
-    auto item = Editable(WritePng(m_dir, "wide.png", Gradient(30, 10)));
-    QVERIFY(item);
-    QCOMPARE(item->RotateImage(), 1);
-    QCOMPARE(item->GetImageWidth(), 10);
-    // The rotation is dropped: brightness works on the picture as loaded.
-    QCOMPARE(item->AdjustBrightness(false, 0), 1);
-    QCOMPARE(item->GetImageWidth(), 30);
-    // Contrast works on the current working image and keeps the rotation.
-    QCOMPARE(item->RotateImage(), 1);
-    QCOMPARE(item->AdjustContrast(true, 5), 1);
-    QCOMPARE(item->GetImageWidth(), 10);
 }
 
 void TestPictureImage::contrast_data()
 {
     QTest::addColumn<bool>("more");
-    QTest::addColumn<int>("amount");
-    QTest::addColumn<QList<QRgb>>("before");
     QTest::addColumn<QList<QRgb>>("after");
-    // Means: 127 dark, 128 light, (200 + 10 + 170) / 3 = 126 dark, (0,0,255) = 85 dark.
-    const QList<QRgb> pixels = {qRgb(127, 127, 127), qRgb(128, 128, 128), qRgb(200, 10, 170),
-                                qRgb(0, 0, 255),     qRgb(255, 255, 255), qRgb(0, 0, 0)};
+    // Means: 127 dark, 128 light, 126 dark, 85 dark, 255, 0.
     QTest::newRow("more contrast")
-        << true << 20 << pixels
-        << QList<QRgb>{qRgb(107, 107, 107), qRgb(148, 148, 148), qRgb(180, 0, 150),
-                       qRgb(0, 0, 235),     qRgb(255, 255, 255), qRgb(0, 0, 0)};
+        << true << QList<QRgb>{qRgb(107, 107, 107), qRgb(148, 148, 148), qRgb(180, 0, 150),
+                               qRgb(0, 0, 235),     qRgb(255, 255, 255), qRgb(0, 0, 0)};
     QTest::newRow("less contrast")
-        << false << 20 << pixels
-        << QList<QRgb>{qRgb(147, 147, 147), qRgb(108, 108, 108), qRgb(220, 30, 190),
-                       qRgb(20, 20, 255),   qRgb(235, 235, 235), qRgb(20, 20, 20)};
+        << false << QList<QRgb>{qRgb(147, 147, 147), qRgb(108, 108, 108), qRgb(220, 30, 190),
+                                qRgb(20, 20, 255),   qRgb(235, 235, 235), qRgb(20, 20, 20)};
 }
 
 void TestPictureImage::contrast()
 {
     QFETCH(bool, more);
-    QFETCH(int, amount);
-    QFETCH(QList<QRgb>, before);
     QFETCH(QList<QRgb>, after);
-    QImage image(int(before.size()), 1, QImage::Format_RGB32);
-    for (int x = 0; x < before.size(); ++x)
-        image.setPixel(x, 0, before.at(x));
-    auto item = Editable(WritePng(m_dir, "contrast.png", image));
+    auto item = Editable(Row({qRgb(127, 127, 127), qRgb(128, 128, 128), qRgb(200, 10, 170),
+                              qRgb(0, 0, 255), qRgb(255, 255, 255), qRgb(0, 0, 0)}));
     QVERIFY(item);
-    QCOMPARE(item->AdjustContrast(more, amount), 1);
-    const QImage result = Working(*item, m_dir);
+    QCOMPARE(item->AdjustContrast(more, 20), 1);
+    const QImage result = Working(*item);
     for (int x = 0; x < after.size(); ++x)
         QCOMPARE(QColor(result.pixel(x, 0)), QColor(after.at(x)));
 }
@@ -315,21 +236,16 @@ void TestPictureImage::scaleAveragesAreas()
         for (int x = 0; x < 4; ++x)
             image.setPixel(x, y, qRgb(values[y][x], values[y][x], values[y][x]));
     }
-    auto item = Editable(WritePng(m_dir, "blocks.png", image));
+    auto item = Editable(image);
     QVERIFY(item);
     QCOMPARE(item->ScaleImage(2, 1), 1);
-    const QImage small = Working(*item, m_dir);
+    const QImage small = Working(*item);
     QCOMPARE(small.size(), QSize(2, 1));
-    QVERIFY2(qAbs(qRed(small.pixel(0, 0)) - 100) <= 2,
-             qPrintable(QString::number(small.pixel(0, 0), 16)));
-    QVERIFY2(qAbs(qRed(small.pixel(1, 0)) - 155) <= 2,
-             qPrintable(QString::number(small.pixel(1, 0), 16)));
+    QVERIFY(qAbs(qRed(small.pixel(0, 0)) - 100) <= 2);
+    QVERIFY(qAbs(qRed(small.pixel(1, 0)) - 155) <= 2);
     QCOMPARE(item->ScaleImage(0, 5), 0);
     QCOMPARE(item->ScaleImage(20000, 20000), 0); // 400 megapixels
     QCOMPARE(item->GetImageWidth(), 2);
-    QCOMPARE(item->ScaleImage(9, 3), 1);
-    QCOMPARE(item->GetImageWidth(), 9);
-    QCOMPARE(item->GetImageHeight(), 3);
 }
 
 void TestPictureImage::crop_data()
@@ -337,71 +253,62 @@ void TestPictureImage::crop_data()
     QTest::addColumn<QRect>("block");
     QTest::addColumn<int>("result");
     QTest::newRow("right bottom of 640x480") << QRect(540, 380, 100, 100) << 1;
-    QTest::newRow("left top") << QRect(0, 0, 100, 100) << 1;
     QTest::newRow("whole picture") << QRect(0, 0, 640, 480) << 1;
     QTest::newRow("one pixel past the right") << QRect(541, 380, 100, 100) << 0;
     QTest::newRow("one pixel past the bottom") << QRect(540, 381, 100, 100) << 0;
     QTest::newRow("negative offset") << QRect(-1, 0, 100, 100) << 0;
     QTest::newRow("empty") << QRect(10, 10, 0, 100) << 0;
-    QTest::newRow("larger than the picture") << QRect(0, 0, 641, 480) << 0;
 }
 
 void TestPictureImage::crop()
 {
     QFETCH(QRect, block);
     QFETCH(int, result);
-    static const QString path = WritePng(m_dir, "crop.png", Gradient(640, 480));
-    const QImage source = MagickPixels(path);
-    auto item = Editable(path);
+    const QImage source = Gradient(640, 480);
+    auto item = Editable(source);
     QVERIFY(item);
     QCOMPARE(item->CropImage(block.width(), block.height(), block.x(), block.y()), result);
-    if (!result) {
-        QCOMPARE(item->IsImageEdited(), false);
+    QCOMPARE(item->IsImageEdited(), result == 1);
+    if (result)
+        QCOMPARE(MeanDifference(Working(*item), source.copy(block)), 0.0);
+    else
         QCOMPARE(item->GetImageWidth(), 640);
-        return;
-    }
-    const QImage cropped = Working(*item, m_dir);
-    QCOMPARE(cropped.size(), block.size());
-    QCOMPARE(cropped.pixel(0, 0), source.pixel(block.x(), block.y()));
-    QCOMPARE(cropped.pixel(block.width() - 1, block.height() - 1),
-             source.pixel(block.right(), block.bottom()));
-    QCOMPARE(MeanDifference(cropped, source.copy(block)), 0.0);
 }
 
 void TestPictureImage::editsNeedTheEditableForm()
 {
     CPictureItem item;
-    item.SetPathname(WritePng(m_dir, "display.png", Gradient(8, 8)).toStdString());
+    item.SetPathname(Png(Gradient(8, 8)).toStdString());
     QCOMPARE(item.EnsureLoaded(), 1);
-    QCOMPARE(item.RotateImage(), 0);
-    QCOMPARE(item.AdjustBrightness(false, 10), 0);
-    QCOMPARE(item.AdjustContrast(true, 10), 0);
-    QCOMPARE(item.ScaleImage(4, 4), 0);
-    QCOMPARE(item.CropImage(4, 4, 0, 0), 0);
-    QCOMPARE(item.RevertImage(), 0);
-    QCOMPARE(item.SaveImageAs(m_dir.filePath("never.png").toStdString()), 0);
-    QCOMPARE(item.CommitImage(), 0);
+    const int done = item.RotateImage() + item.AdjustBrightness(false, 10) +
+                     item.AdjustContrast(true, 10) + item.ScaleImage(4, 4) +
+                     item.CropImage(4, 4, 0, 0) + item.RevertImage() + item.CommitImage() +
+                     item.SaveImageAs(m_dir.filePath("never.png").toStdString());
+    QCOMPARE(done, 0);
     QVERIFY(!QFileInfo::exists(m_dir.filePath("never.png")));
     // Once editable, a later load keeps the edits.
     QCOMPARE(item.LoadImage(CPictureItem::kEditableForm), 1);
     QCOMPARE(item.RotateImage(), 1);
     QCOMPARE(item.LoadImage(CPictureItem::kDisplayForm), 1);
-    QCOMPARE(item.GetImageMode(), int(CPictureItem::kEditableForm));
     QCOMPARE(item.IsImageEdited(), true);
+    // A copy has the entry, not the decoded picture.
+    CPictureItem copy(item);
+    QCOMPARE(copy.GetImageMode(), int(CPictureItem::kDisplayForm));
+    QCOMPARE(copy.IsImageEdited(), false);
 }
 
 void TestPictureImage::revertAndCommit()
 {
-    const QString path = WritePng(m_dir, "commit.png", Gradient(40, 20));
+    const QString path = Png(Gradient(40, 20));
     QFile file(path);
     QVERIFY(file.open(QIODevice::ReadOnly));
     const QByteArray before = file.readAll();
     file.close();
-    auto item = Editable(path);
-    QVERIFY(item);
+    auto item = std::make_unique<CPictureItem>();
+    item->SetPathname(path.toStdString());
+    QCOMPARE(item->LoadImage(CPictureItem::kEditableForm), 1);
     QCOMPARE(item->RotateImage(), 1);
     QCOMPARE(item->RevertImage(), 1);
-    QCOMPARE(item->IsImageEdited(), false);
     QCOMPARE(item->CommitImage(), 1);
     QVERIFY(file.open(QIODevice::ReadOnly));
     QCOMPARE(file.readAll(), before);
@@ -410,32 +317,25 @@ void TestPictureImage::revertAndCommit()
     QCOMPARE(item->RotateImage(), 1);
     QCOMPARE(item->CommitImage(), 1);
     QCOMPARE(Identify(path), QStringLiteral("PNG 20 40"));
-    // The images were released; the next use reads the saved file.
-    QCOMPARE(item->IsImageEdited(), false);
-    QCOMPARE(item->GetImageWidth(), 20);
-    QCOMPARE(item->GetLoadedWidth(), 20);
-}
+    QCOMPARE(item->GetImageWidth(), 20); // released, then read from the saved file
 
-void TestPictureImage::failedCommitKeepsEdits()
-{
-    // A PNG under a name no encoder lists: it loads, but cannot be written back.
-    QFile::copy(WritePng(m_dir, "named.png", Gradient(12, 6)), m_dir.filePath("named.xyz"));
-    const QString path = m_dir.filePath("named.xyz");
-    auto item = Editable(path);
-    QVERIFY(item);
+    // Under a name no encoder lists the picture loads, but cannot be written back.
+    const QString odd = m_dir.filePath("named.xyz");
+    QVERIFY(QFile::copy(path, odd));
+    item->SetPathname(odd.toStdString());
+    item->ReleaseImage();
     QCOMPARE(item->RotateImage(), 1);
     QCOMPARE(item->CommitImage(), 0);
     QCOMPARE(item->IsImageEdited(), true);
-    QCOMPARE(item->GetImageWidth(), 6);
-    QCOMPARE(Identify(path), QStringLiteral("PNG 12 6"));
+    QCOMPARE(Identify(odd), QStringLiteral("PNG 20 40"));
 }
 
 void TestPictureImage::saveByExtension_data()
 {
     QTest::addColumn<QString>("name");
-    QTest::addColumn<QString>("format");
+    QTest::addColumn<QString>("format"); // empty: nothing may be written
     QTest::addColumn<double>("tolerance");
-    // Sharp colour edges cost JPEG a few levels (chroma is halved).
+    // Sharp colour edges cost JPEG a few levels (its colour is halved).
     QTest::newRow("jpg") << "out.jpg"
                          << "JPEG" << 6.0;
     QTest::newRow("JPG upper case") << "OUT2.JPG"
@@ -450,10 +350,16 @@ void TestPictureImage::saveByExtension_data()
                          << "BMP" << 0.0;
     QTest::newRow("gif") << "out.gif"
                          << "GIF" << 0.0;
-    QTest::newRow("GIF upper case") << "out2.GIF"
-                                    << "GIF" << 0.0;
-    QTest::newRow("dots in the folder name") << "a.b/out"
-                                             << "" << 0.0;
+    QTest::newRow("unknown extension") << "out.xyz"
+                                       << "" << 0.0;
+    QTest::newRow("no extension") << "out"
+                                  << "" << 0.0;
+    QTest::newRow("trailing dot") << "out."
+                                  << "" << 0.0;
+    QTest::newRow("wmf has no encoder") << "out.wmf"
+                                        << "" << 0.0;
+    QTest::newRow("dot in the folder only") << "a.b/out"
+                                            << "" << 0.0;
 }
 
 void TestPictureImage::saveByExtension()
@@ -461,14 +367,14 @@ void TestPictureImage::saveByExtension()
     QFETCH(QString, name);
     QFETCH(QString, format);
     QFETCH(double, tolerance);
-    // 200 colours: every format, GIF included, can hold them exactly.
+    // 100 colours: every format, GIF included, can hold them exactly.
     QImage image(40, 30, QImage::Format_RGB32);
     for (int y = 0; y < 30; ++y) {
         for (int x = 0; x < 40; ++x)
             image.setPixel(x, y, qRgb((x / 4) * 25, (y / 3) * 25, 90));
     }
     QDir(m_dir.path()).mkpath(QStringLiteral("a.b"));
-    auto item = Editable(WritePng(m_dir, "source.png", image));
+    auto item = Editable(image);
     QVERIFY(item);
     const QString target = m_dir.filePath(name);
     QCOMPARE(item->SaveImageAs(target.toStdString()), format.isEmpty() ? 0 : 1);
@@ -480,102 +386,51 @@ void TestPictureImage::saveByExtension()
     const QStringList identified = Identify(target).split(QLatin1Char(' '));
     QCOMPARE(identified.size(), 3);
     QVERIFY2(identified.at(0).startsWith(format), qPrintable(identified.at(0)));
-    QCOMPARE(identified.at(1) + "x" + identified.at(2), QStringLiteral("40x30"));
     const double difference = MeanDifference(MagickPixels(target), image);
     QVERIFY2(difference >= 0 && difference <= tolerance, qPrintable(QString::number(difference)));
 }
 
-void TestPictureImage::gifOfManyColours()
+void TestPictureImage::gifPalette()
 {
-    // 96 x 96 smooth colours (thousands of them) through a 256-colour palette.
+    // Thousands of smooth colours through 256. Dithering trades per-pixel error
+    // for the right colour over an area: both are judged, the second on 4 x 4
+    // averages (ImageMagick's own GIF of it: 5.2 and 0.8).
     const QImage image = Gradient(96, 96);
-    auto item = Editable(WritePng(m_dir, "many.png", image));
+    auto item = Editable(image);
     QVERIFY(item);
     const QString target = m_dir.filePath("many.gif");
     QCOMPARE(item->SaveImageAs(target.toStdString()), 1);
-    QCOMPARE(Identify(target), QStringLiteral("GIF 96 96"));
-    // Dithering trades per-pixel error for the right colour over an area: judge
-    // both, the second on 4 x 4 averages (ImageMagick's own GIF: 5.2 and 0.8).
     const QImage decoded = MagickPixels(target);
-    const double difference = MeanDifference(decoded, image);
-    QVERIFY2(difference >= 0 && difference < 6.0, qPrintable(QString::number(difference)));
+    QVERIFY(MeanDifference(decoded, image) >= 0 && MeanDifference(decoded, image) < 6.0);
     const auto areas = [](const QImage& i) {
         return i.scaled(24, 24, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
     };
-    const double areaDifference = MeanDifference(areas(decoded), areas(image));
-    QVERIFY2(areaDifference < 1.6, qPrintable(QString::number(areaDifference)));
-}
+    QVERIFY(MeanDifference(areas(decoded), areas(image)) < 1.6);
 
-void TestPictureImage::gifKeepsTransparency()
-{
-    QImage image(4, 1, QImage::Format_ARGB32);
-    image.setPixel(0, 0, qRgba(0, 0, 0, 0));
-    image.setPixel(1, 0, qRgba(255, 0, 0, 255));
-    image.setPixel(2, 0, qRgba(0, 255, 0, 200));
-    image.setPixel(3, 0, qRgba(0, 0, 255, 100));
-    auto item = Editable(WritePng(m_dir, "alpha.png", image));
-    QVERIFY(item);
-    const QString target = m_dir.filePath("alpha.gif");
-    QCOMPARE(item->SaveImageAs(target.toStdString()), 1);
+    // Pixels less than half opaque become the transparent colour.
+    QImage alpha(3, 1, QImage::Format_ARGB32);
+    alpha.setPixel(0, 0, qRgba(0, 0, 0, 0));
+    alpha.setPixel(1, 0, qRgba(255, 0, 0, 200));
+    alpha.setPixel(2, 0, qRgba(0, 0, 255, 100));
+    QCOMPARE(Editable(alpha)->SaveImageAs(target.toStdString()), 1);
     const QByteArray rgba = Magick("convert", {target, "-depth", "8", "rgba:-"});
-    QCOMPARE(rgba.size(), 16);
-    const auto at = [&rgba](int i) { return int(uchar(rgba.at(i))); };
-    QCOMPARE(at(3), 0);
-    QCOMPARE(QList<int>({at(4), at(5), at(6), at(7)}), QList<int>({255, 0, 0, 255}));
-    QCOMPARE(QList<int>({at(8), at(9), at(10), at(11)}), QList<int>({0, 255, 0, 255}));
-    QCOMPARE(at(15), 0); // less than half opaque
+    QCOMPARE(rgba.size(), 12);
+    QCOMPARE(rgba.at(3), '\0');
+    QCOMPARE(rgba.mid(4, 4).toHex(), QByteArray("ff0000ff"));
+    QCOMPARE(rgba.at(11), '\0');
 }
 
-void TestPictureImage::unknownExtensionWritesNothing_data()
+void TestPictureImage::decodeLimit()
 {
-    QTest::addColumn<QString>("name");
-    QTest::newRow("unknown extension") << "out.xyz";
-    QTest::newRow("no extension") << "out";
-    QTest::newRow("trailing dot") << "out.";
-    QTest::newRow("wmf has no encoder") << "out.wmf";
-}
-
-void TestPictureImage::unknownExtensionWritesNothing()
-{
-    QFETCH(QString, name);
-    auto item = Editable(WritePng(m_dir, "unknown.png", Gradient(5, 5)));
-    QVERIFY(item);
-    const QString target = m_dir.filePath(name);
-    QCOMPARE(item->SaveImageAs(target.toStdString()), 0);
-    QVERIFY(!QFileInfo::exists(target));
-}
-
-void TestPictureImage::decodeLimits_data()
-{
-    QTest::addColumn<QByteArray>("bytes");
-    QTest::addColumn<QString>("name");
-    QTest::newRow("PNG claiming 20000 x 20000") << PngClaiming(20000, 20000, 8, 2) << "big.png";
-    QTest::newRow("16-bit RGBA PNG needing 1.15 GB")
-        << PngClaiming(12000, 12000, 16, 6) << "deep.png";
     // A real JPEG whose frame header is changed to claim 60000 x 60000.
     QByteArray jpeg;
     QBuffer buffer(&jpeg);
     buffer.open(QIODevice::WriteOnly);
     Gradient(16, 16).save(&buffer, "JPEG");
     const int sof = int(jpeg.indexOf("\xFF\xC0"));
-    for (int k : {5, 7}) {
-        jpeg[sof + k] = char(0xEA);
-        jpeg[sof + k + 1] = char(0x60);
-    }
-    QTest::newRow("JPEG claiming 60000 x 60000") << jpeg << "big.jpg";
-}
-
-void TestPictureImage::decodeLimits()
-{
-    QFETCH(QByteArray, bytes);
-    QFETCH(QString, name);
-    const QString path = m_dir.filePath(name);
-    QFile file(path);
-    QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write(bytes);
-    file.close();
+    jpeg.replace(sof + 5, 4, QByteArray("\xEA\x60\xEA\x60", 4));
     CPictureItem item;
-    item.SetPathname(path.toStdString());
+    item.SetPathname(WriteFile(m_dir.filePath("huge.jpg"), jpeg).toStdString());
     QCOMPARE(item.LoadImage(CPictureItem::kEditableForm), 0);
     QCOMPARE(item.GetImageMode(), int(CPictureItem::kDisplayForm));
     QCOMPARE(item.LoadImage(CPictureItem::kDisplayForm), 0);
@@ -590,28 +445,11 @@ void TestPictureImage::loadReadsExif()
     CPictureItem drawn;
     drawn.SetPathname(sample.toStdString());
     QCOMPARE(drawn.EnsureLoaded(), 1);
-    QCOMPARE(drawn.GetExifRead(), 0);
+    QCOMPARE(drawn.GetExifRead(), 0); // only LoadImage reads the camera data
     CPictureItem loaded;
     loaded.SetPathname(sample.toStdString());
     QCOMPARE(loaded.LoadImage(CPictureItem::kDisplayForm), 1);
-    QCOMPARE(loaded.GetExifRead(), 1);
     QCOMPARE(loaded.GetExifInfo().cameraModel, std::string("Canon EOS 40D"));
-}
-
-void TestPictureImage::copyLeavesTheDecodedPicture()
-{
-    auto item = Editable(WritePng(m_dir, "copied.png", Gradient(8, 4)));
-    QVERIFY(item);
-    item->SetLabel("copied");
-    item->SetWhiteBorder(1);
-    QCOMPARE(item->RotateImage(), 1);
-    CPictureItem copy(*item);
-    QCOMPARE(copy.GetLabel(), std::string("copied"));
-    QCOMPARE(copy.GetWhiteBorder(), 1);
-    QCOMPARE(copy.GetImageMode(), int(CPictureItem::kDisplayForm));
-    QCOMPARE(copy.IsImageEdited(), false);
-    QCOMPARE(copy.GetImageWidth(), 8); // its own decoding of the file
-    QCOMPARE(item->GetImageWidth(), 4);
 }
 
 QTEST_MAIN(TestPictureImage)

@@ -54,10 +54,8 @@ private slots:
     void writesFreedesktopThumbnail();
     void validOnlyForTheSameFile();
     void failureRecord();
-    void refusesHugePictures();
     void orientationAndReducedDecode_data();
     void orientationAndReducedDecode();
-    void largerSizesAndBoxes();
     void serviceAnswersLater();
     void invalidateForgetsEverything();
     void pictureCellFromThumbnails();
@@ -126,6 +124,9 @@ void TestThumbnails::writesFreedesktopThumbnail()
                                           .arg(QString::fromUtf8(uri))
                                           .arg(MTime(picture))
                                           .arg(QFileInfo(picture).size()));
+    // A picture smaller than the flavor is never enlarged.
+    const QString small = WriteJpeg(m_dir->filePath("small.jpg"), Gradient(40, 30));
+    QCOMPARE(service.Make(small, 128).image.size(), QSize(40, 30));
 }
 
 void TestThumbnails::validOnlyForTheSameFile()
@@ -175,24 +176,6 @@ void TestThumbnails::failureRecord()
     QCOMPARE(MakeThumbnail(m_dir->filePath("none.jpg"), 128, &cache).status, CThumbnail::Missing);
 }
 
-void TestThumbnails::refusesHugePictures()
-{
-    QByteArray jpeg;
-    QBuffer buffer(&jpeg);
-    buffer.open(QIODevice::WriteOnly);
-    Gradient(16, 16).save(&buffer, "JPEG");
-    const int sof = int(jpeg.indexOf("\xFF\xC0"));
-    jpeg[sof + 5] = char(0x4E); // 20000 x 20000: 400 megapixels
-    jpeg[sof + 6] = char(0x20);
-    jpeg[sof + 7] = char(0x4E);
-    jpeg[sof + 8] = char(0x20);
-    QFile file(m_dir->filePath("huge.jpg"));
-    QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write(jpeg);
-    file.close();
-    QCOMPARE(MakeThumbnail(file.fileName(), 128, nullptr).status, CThumbnail::Failed);
-}
-
 void TestThumbnails::orientationAndReducedDecode_data()
 {
     QTest::addColumn<QString>("name");
@@ -221,23 +204,6 @@ void TestThumbnails::orientationAndReducedDecode()
         MeanDifference(made.image.convertToFormat(QImage::Format_RGB32), expected);
     // Resampling differs (about 5 levels); a wrong turn or mirror differs by 40 or more.
     QVERIFY2(difference >= 0 && difference < 10.0, qPrintable(QString::number(difference)));
-}
-
-void TestThumbnails::largerSizesAndBoxes()
-{
-    const QString picture = WriteJpeg(m_dir->filePath("tall.jpg"), Gradient(300, 1200));
-    CThumbnailCache cache(m_root);
-    // 200 is served by the large flavor (256), 1500 by the picture itself.
-    QCOMPARE(MakeThumbnail(picture, 200, &cache).image.size(), QSize(64, 256));
-    QVERIFY(QFileInfo::exists(
-        cache.ThumbnailPath(CThumbnailCache::Flavor::Large, CThumbnailCache::FileUri(picture))));
-    const CThumbnail big = MakeThumbnail(picture, 1500, &cache);
-    QCOMPARE(big.image.size(), QSize(300, 1200));
-    QCOMPARE(ThumbnailForBox(big, 100).size(), QSize(25, 100));
-    QCOMPARE(ThumbnailForBox(big, 5000).size(), QSize(300, 1200));
-    // A picture smaller than the flavor is never enlarged.
-    const QString small = WriteJpeg(m_dir->filePath("small.jpg"), Gradient(40, 30));
-    QCOMPARE(MakeThumbnail(small, 128, &cache).image.size(), QSize(40, 30));
 }
 
 void TestThumbnails::serviceAnswersLater()
