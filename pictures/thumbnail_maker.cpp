@@ -3,6 +3,8 @@
 #include "pictures/image_decode.h"
 #include "pictures/thumbnail_cache.h"
 
+#include <QFileInfo>
+
 CThumbnail MakeThumbnail(const QString& path, int size, const CThumbnailCache* cache)
 {
     CThumbnail result;
@@ -37,7 +39,8 @@ CThumbnail MakeThumbnail(const QString& path, int size, const CThumbnailCache* c
     const CDecodedPicture decoded = DecodePicture(key.path, QSize(edge, edge));
     if (decoded.image.isNull()) {
         result.status = CThumbnail::Failed;
-        if (useCache)
+        // A file we may not read is not a failed picture: no lasting record.
+        if (useCache && QFileInfo(key.path).isReadable())
             cache->WriteFailure(key);
         return result;
     }
