@@ -79,7 +79,7 @@ void TestThumbnails::fileUri_data()
     QTest::addColumn<QString>("path");
     QTest::addColumn<QByteArray>("uri");
     QTest::addColumn<QString>("hash");
-    // The freedesktop thumbnail specification's own example.
+    // The example in the freedesktop.org thumbnail standard itself.
     QTest::newRow("plain") << "/home/jens/photos/me.png"
                            << QByteArray("file:///home/jens/photos/me.png")
                            << "c6ee772d9e49320e97ec29a7eb5b1697.png";
