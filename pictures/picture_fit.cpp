@@ -65,38 +65,6 @@ QRect FitPictureRect(const QSize& picture, const QRect& target, bool fitToFrame)
     return FromEdges(l, t, r, b);
 }
 
-QSize FitWebThumbnail(const QSize& picture, const QSize& box)
-{
-    const int W = picture.width(), H = picture.height();
-    const int BW = box.width(), BH = box.height();
-    if (W <= 0 || H <= 0)
-        return box;
-    const double sx = double(BW) / W;
-    const double sy = double(BH) / H;
-    int w = BW, h = BH;
-    if (W > BW && H > BH) {
-        const double s = sy < sx ? sy : sx;
-        w = int(s * W);
-        h = int(s * H);
-    } else {
-        if (W > BW) {
-            w = BW;
-            h = int(sx * H);
-        }
-        if (H > BH) {
-            h = BH;
-            w = int(sy * W);
-        }
-        // Both sides are compared with the box width here.
-        if (W < BW && H < BW) {
-            const double s = sx <= sy ? sx : sy;
-            w = int(s * W);
-            h = int(s * H);
-        }
-    }
-    return QSize(w, BH - 2 * ((BH - h) / 2));
-}
-
 bool DrawFittedPicture(QPainter& painter, const QImage& image, const QSize& pictureSize,
                        const QRect& target, bool fitToFrame, bool whiteBorder,
                        CScaledImageCache* cache)

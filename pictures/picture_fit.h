@@ -14,12 +14,6 @@ class QPainter;
 // around the centre.
 QRect FitPictureRect(const QSize& picture, const QRect& target, bool fitToFrame);
 
-// The size of a picture's image cell on a photo album web page, in a box of
-// the album's thumbnail size: shrunk or grown to the box, the height rounded
-// so that the box's unused height splits evenly. The box size for a picture
-// of no size.
-QSize FitWebThumbnail(const QSize& picture, const QSize& box);
-
 // The last smooth reduction of an image for drawing, kept between paints.
 struct CScaledImageCache
 {

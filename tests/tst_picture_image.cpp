@@ -39,8 +39,6 @@ private slots:
     void initTestCase();
     void fitRule_data();
     void fitRule();
-    void webThumbnailFit_data();
-    void webThumbnailFit();
     void drawFitsAndMats();
     void rotation();
     void brightness();
@@ -123,33 +121,6 @@ void TestPictureImage::fitRule()
     QFETCH(bool, fit);
     QFETCH(QRect, expected);
     QCOMPARE(FitPictureRect(picture, target, fit), expected);
-}
-
-void TestPictureImage::webThumbnailFit_data()
-{
-    QTest::addColumn<QSize>("picture");
-    QTest::addColumn<QSize>("box");
-    QTest::addColumn<QSize>("expected");
-    // h = 125; the unused 75 halve to 37, so the height is 200 - 74.
-    QTest::newRow("large box, 1000x500") << QSize(1000, 500) << QSize(250, 200) << QSize(250, 126);
-    QTest::newRow("as wide as the box, not taller")
-        << QSize(250, 100) << QSize(250, 200) << QSize(250, 200);
-    QTest::newRow("as tall as a square box, narrower")
-        << QSize(150, 200) << QSize(200, 200) << QSize(200, 200);
-    QTest::newRow("small picture grows") << QSize(50, 20) << QSize(150, 150) << QSize(150, 60);
-    QTest::newRow("wider only") << QSize(400, 100) << QSize(200, 200) << QSize(200, 50);
-    QTest::newRow("odd unused height adds one")
-        << QSize(300, 103) << QSize(150, 150) << QSize(150, 52);
-    QTest::newRow("taller only") << QSize(100, 400) << QSize(200, 200) << QSize(50, 200);
-    QTest::newRow("no size") << QSize(0, 0) << QSize(150, 150) << QSize(150, 150);
-}
-
-void TestPictureImage::webThumbnailFit()
-{
-    QFETCH(QSize, picture);
-    QFETCH(QSize, box);
-    QFETCH(QSize, expected);
-    QCOMPARE(FitWebThumbnail(picture, box), expected);
 }
 
 void TestPictureImage::drawFitsAndMats()
