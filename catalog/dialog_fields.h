@@ -133,3 +133,20 @@ struct CDocumentSetFields
     std::string keyword2;
     std::vector<std::shared_ptr<CDocumentItem>> members;
 };
+
+// "Resize/Convert Picture(s)".
+struct CPicResizeFields
+{
+    enum Mode { Scale = 1, Crop = 2, Small = 3, VerySmall = 4 };
+    enum CropLocation { Center = 0, RightTop, RightBottom, LeftBottom, LeftTop };
+
+    int mode = Scale;
+    int width = 0;
+    int height = 0;
+    bool maintainRatio = true;
+    int cropLocation = Center;
+    bool convert = false;
+    std::string pictureType = "jpg"; // "jpg", "bmp", "png" or "gif"
+    int referenceWidth = 0;          // the size the ratio is kept from
+    int referenceHeight = 0;
+};

@@ -67,6 +67,8 @@ public:
     bool IsAlbum() const override { return true; }
     // Generates the pages into the temporary folder and opens the index.
     bool ViewAsWebPage(CAppContext& context) override;
+    // Mails the album's pages and pictures, resized or converted if asked.
+    void Mail(CAppContext& context) override;
 
     // Writes the index (the site's master page), one page per picturesPerPage
     // pictures and a numbered copy of every picture into folder. False when

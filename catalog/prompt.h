@@ -60,6 +60,7 @@ public:
     virtual bool EditEvent(CEventFields& fields) { return Cancel(fields); }
     virtual bool EditRecipe(CRecipeFields& fields) { return Cancel(fields); }
     virtual bool EditDocumentSet(CDocumentSetFields& fields) { return Cancel(fields); }
+    virtual bool ResizePictures(CPicResizeFields& fields) { return Cancel(fields); }
 
 private:
     template <typename T>

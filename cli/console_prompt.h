@@ -5,6 +5,7 @@
 #include "catalog/prompt.h"
 
 #include <cstdio>
+#include <optional>
 
 class CConsolePrompt : public CPrompt
 {
@@ -31,11 +32,24 @@ public:
         return Given(m_pdfFile, pdfPath) || !m_printer.empty();
     }
     bool OpenWithShell(const std::string& path) override;
+    bool ResizePictures(CPicResizeFields& fields) override
+    {
+        if (!m_resize)
+            return false;
+        fields = *m_resize;
+        return true;
+    }
 
     void SetFolder(const std::string& folder) { m_folder = folder; }
     void SetSaveFile(const std::string& path) { m_saveFile = path; }
     void SetPdfFile(const std::string& path) { m_pdfFile = path; }
     void SetPrinter(const std::string& name) { m_printer = name; }
+    // Resize choices for mailed pictures: the convert question is then answered Yes.
+    void SetResize(const CPicResizeFields& fields)
+    {
+        m_resize = fields;
+        m_questionAnswer = CPrompt::Answer::Yes;
+    }
 
 private:
     static bool Given(const std::string& given, std::string& out)
@@ -52,4 +66,5 @@ private:
     std::string m_saveFile;
     std::string m_pdfFile;
     std::string m_printer;
+    std::optional<CPicResizeFields> m_resize;
 };

@@ -5,6 +5,10 @@
 #include "cli/console_prompt.h"
 #include "output/album_pages.h"
 #include "output/data_item_print.h"
+#include "output/mapi_mail.h"
+#include "output/output_services.h"
+#include "output/picture_mail.h"
+#include "output/picture_pages.h"
 
 #include <QCommandLineOption>
 
@@ -117,16 +121,99 @@ int RunAlbumHtml(CliContext& c)
     return SaveAlbumWebPages(c.prompt, album, folder) ? kExitOk : kExitFailure;
 }
 
+// --resize small | very-small | WIDTHxHEIGHT and --convert TYPE for mailed pictures.
+bool ResizeFromOptions(const CliContext& c, CPicResizeFields& fields, bool& wanted)
+{
+    const QString resize = c.parser.value(QStringLiteral("resize"));
+    const QString convert = c.parser.value(QStringLiteral("convert"));
+    wanted = !resize.isEmpty() || !convert.isEmpty();
+    fields.mode = 0; // unchanged unless --resize says otherwise
+    if (resize == QLatin1String("small")) {
+        fields.mode = CPicResizeFields::Small;
+    } else if (resize == QLatin1String("very-small")) {
+        fields.mode = CPicResizeFields::VerySmall;
+    } else if (!resize.isEmpty()) {
+        const QStringList size = resize.split(QLatin1Char('x'));
+        bool okWidth = false;
+        bool okHeight = false;
+        fields.mode = CPicResizeFields::Scale;
+        fields.width = size.value(0).toInt(&okWidth);
+        fields.height = size.value(1).toInt(&okHeight);
+        if (size.size() != 2 || !okWidth || !okHeight || fields.width <= 0 || fields.height <= 0)
+            return false;
+    }
+    if (!convert.isEmpty()) {
+        if (!QStringList{"jpg", "bmp", "png", "gif"}.contains(convert))
+            return false;
+        fields.convert = true;
+        fields.pictureType = convert.toStdString();
+    }
+    return true;
+}
+
 int RunMail(CliContext& c)
 {
+    CPicResizeFields resize;
+    bool resizing = false;
+    if (!ResizeFromOptions(c, resize, resizing))
+        return c.Usage(QStringLiteral("--resize takes small, very-small or WIDTHxHEIGHT; "
+                                      "--convert takes jpg, bmp, png or gif"));
+    if (resizing)
+        c.prompt.SetResize(resize);
     std::unique_ptr<CTallowmereDoc> doc;
     std::vector<CCatalogItem*> items;
     if (const int exit = OpenWithItems(c, doc, items))
         return exit;
     const int errorsBefore = c.prompt.ErrorCount();
-    for (CCatalogItem* item : items)
-        item->Mail(doc->GetContext());
+    std::vector<CPictureItem*> pictures;
+    std::vector<CMailAttachment> documents;
+    for (CCatalogItem* item : items) {
+        auto* document = dynamic_cast<CDocumentItem*>(item);
+        if (document && document->IsPicture())
+            pictures.push_back(static_cast<CPictureItem*>(document));
+        else if (document)
+            documents.push_back({document->GetPathname(),
+                                 CMapiMail::DisplayName(document->GetPathname())});
+        else
+            item->Mail(doc->GetContext());
+    }
+    if (!pictures.empty())
+        MailPictures(c.prompt, pictures);
+    if (!documents.empty())
+        CMailProgram(c.prompt).SendDocuments(documents);
     return c.prompt.ErrorCount() == errorsBefore ? kExitOk : kExitFailure;
+}
+
+int RunPrintPictures(CliContext& c)
+{
+    if (!c.parser.isSet(QStringLiteral("pdf")) == !c.parser.isSet(QStringLiteral("printer")))
+        return c.Usage(QStringLiteral("print-pictures needs either --pdf FILE or --printer QUEUE"));
+    std::unique_ptr<CTallowmereDoc> doc;
+    std::vector<CCatalogItem*> items;
+    if (const int exit = OpenWithItems(c, doc, items))
+        return exit;
+    std::vector<CPictureItem*> pictures;
+    for (CCatalogItem* item : items) {
+        auto* document = dynamic_cast<CDocumentItem*>(item);
+        if (!document || !document->IsPicture())
+            return c.Failure(QStringLiteral("item %1 is not a picture")
+                                 .arg(item->GetSequenceNumber()));
+        pictures.push_back(static_cast<CPictureItem*>(document));
+    }
+    c.prompt.SetPdfFile(c.parser.value(QStringLiteral("pdf")).toStdString());
+    c.prompt.SetPrinter(c.parser.value(QStringLiteral("printer")).toStdString());
+    return PrintPictures(c.prompt, pictures) ? kExitOk : kExitFailure;
+}
+
+void MailOptions(QCommandLineParser& parser)
+{
+    parser.addOption(QCommandLineOption(
+        QStringLiteral("resize"),
+        QStringLiteral("Mail pictures smaller: small, very-small or WIDTHxHEIGHT."),
+        QStringLiteral("SIZE")));
+    parser.addOption(QCommandLineOption(QStringLiteral("convert"),
+                                        QStringLiteral("Mail pictures as jpg, bmp, png or gif."),
+                                        QStringLiteral("TYPE")));
 }
 
 void TextOptions(QCommandLineParser& parser)
@@ -167,8 +254,12 @@ const CliRegistration kAlbumHtml{
     {QStringLiteral("album-html"), QStringLiteral("SETSEQ --folder DIR"),
      QStringLiteral("Write a photo album's index, pages and picture copies into a folder."),
      FolderOption, RunAlbumHtml}};
-const CliRegistration kMail{{QStringLiteral("mail"), QStringLiteral("SEQ..."),
-                             QStringLiteral("Hand items to the mail program (xdg-email)."),
-                             nullptr, RunMail}};
+const CliRegistration kMail{
+    {QStringLiteral("mail"), QStringLiteral("SEQ... [--resize SIZE] [--convert TYPE]"),
+     QStringLiteral("Hand items to the mail program (xdg-email); pictures go in one message."),
+     MailOptions, RunMail, true}};
+const CliRegistration kPrintPictures{
+    {QStringLiteral("print-pictures"), QStringLiteral("SEQ... --pdf FILE | --printer QUEUE"),
+     QStringLiteral("Print pictures, one to a page."), PrintOptions, RunPrintPictures, true}};
 
 } // namespace

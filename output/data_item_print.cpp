@@ -1,6 +1,5 @@
 #include "output/data_item_print.h"
 
-#include "catalog/app_folders.h"
 #include "catalog/catalog_item.h"
 #include "catalog/prompt.h"
 #include "catalog/text_util.h"
@@ -8,12 +7,10 @@
 
 #include <QFontDatabase>
 #include <QGuiApplication>
-#include <QPageSize>
+#include <QPagedPaintDevice>
 #include <QPainter>
-#include <QPdfWriter>
 
 #include <cstdio>
-#include <unistd.h>
 
 namespace {
 
@@ -74,39 +71,9 @@ bool DrawTextPages(QPagedPaintDevice& device, const std::vector<CPrintPage>& pag
 
 bool PrintDataItems(CPrompt& prompt, const std::vector<const CCatalogItem*>& items)
 {
-    std::string printer;
-    std::string pdfPath;
-    if (!prompt.ChoosePrinter(printer, pdfPath))
-        return false;
-    const bool toQueue = !printer.empty();
-    if (toQueue) {
-        const std::string folder = CAppFolders::GetTempFolder();
-        pdfPath = folder + "/print-" + std::to_string(::getpid()) + ".pdf";
-    }
     const std::vector<CPrintPage> pages = LayOutDataItemPages(items);
-    {
-        QPdfWriter writer(QString::fromStdString(pdfPath));
-        writer.setTitle(QStringLiteral("Quillery"));
-        writer.setPageSize(QPageSize(QPageSize::A4));
-        if (!DrawTextPages(writer, pages)) {
-            prompt.MessageBox(StrFormat("Unable to print into %s.", pdfPath.c_str()), "Print",
-                              CPrompt::Icon::Stop);
-            return false;
-        }
-    }
-    if (!toQueue)
-        return true;
-    std::string error;
-    const int job = SubmitPdfToPrinter(printer, pdfPath, "Quillery", error);
-    std::remove(pdfPath.c_str());
-    if (job <= 0) {
-        prompt.MessageBox(StrFormat("Unable to print on %s: %s", printer.c_str(), error.c_str()),
-                          "Print", CPrompt::Icon::Stop);
-        return false;
-    }
-    prompt.MessageBox(StrFormat("Print job #%d submitted", job), "Debug",
-                      CPrompt::Icon::Information);
-    return true;
+    return RunPrintJob(prompt, "Quillery",
+                       [&pages](QPagedPaintDevice& device) { return DrawTextPages(device, pages); });
 }
 
 int AssignPrintPages(const std::vector<CCatalogItem*>& items)

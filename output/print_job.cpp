@@ -1,6 +1,15 @@
 #include "output/print_job.h"
 
+#include "catalog/app_folders.h"
+#include "catalog/prompt.h"
+#include "catalog/text_util.h"
+
+#include <QPageSize>
+#include <QPdfWriter>
+
+#include <cstdio>
 #include <cups/cups.h>
+#include <unistd.h>
 
 int SubmitPdfToPrinter(const std::string& printerName, const std::string& pdfPath,
                        const std::string& title, std::string& error)
@@ -12,4 +21,41 @@ int SubmitPdfToPrinter(const std::string& printerName, const std::string& pdfPat
         return 0;
     }
     return job;
+}
+
+bool RunPrintJob(CPrompt& prompt, const std::string& title,
+                 const std::function<bool(QPagedPaintDevice&)>& draw)
+{
+    std::string printer;
+    std::string pdfPath;
+    if (!prompt.ChoosePrinter(printer, pdfPath))
+        return false;
+    const bool toQueue = !printer.empty();
+    if (toQueue)
+        pdfPath = CAppFolders::GetTempFolder() + "/print-" + std::to_string(::getpid()) + ".pdf";
+    bool drawn;
+    {
+        QPdfWriter writer(QString::fromStdString(pdfPath));
+        writer.setTitle(QString::fromStdString(title));
+        writer.setPageSize(QPageSize(QPageSize::A4));
+        drawn = draw(writer);
+    }
+    if (!drawn) {
+        prompt.MessageBox(StrFormat("Unable to print into %s.", pdfPath.c_str()), "Print",
+                          CPrompt::Icon::Stop);
+        return false;
+    }
+    if (!toQueue)
+        return true;
+    std::string error;
+    const int job = SubmitPdfToPrinter(printer, pdfPath, title, error);
+    std::remove(pdfPath.c_str());
+    if (job <= 0) {
+        prompt.MessageBox(StrFormat("Unable to print on %s: %s", printer.c_str(), error.c_str()),
+                          "Print", CPrompt::Icon::Stop);
+        return false;
+    }
+    prompt.MessageBox(StrFormat("Print job #%d submitted", job), "Debug",
+                      CPrompt::Icon::Information);
+    return true;
 }

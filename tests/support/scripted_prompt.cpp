@@ -100,6 +100,12 @@ bool CScriptedPrompt::EditDocumentSet(CDocumentSetFields& fields)
     return Run(editDocumentSet, fields);
 }
 
+bool CScriptedPrompt::ResizePictures(CPicResizeFields& fields)
+{
+    dialogs.push_back("Resize/Convert Picture(s)");
+    return Run(resizePictures, fields);
+}
+
 CScriptedPrompt::Shown CScriptedPrompt::Only() const
 {
     if (shown.size() != 1)

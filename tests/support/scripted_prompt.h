@@ -43,6 +43,7 @@ public:
     bool EditEvent(CEventFields& fields) override;
     bool EditRecipe(CRecipeFields& fields) override;
     bool EditDocumentSet(CDocumentSetFields& fields) override;
+    bool ResizePictures(CPicResizeFields& fields) override;
 
     void QueueAnswer(Answer answer) { answers.push_back(answer); }
     // The one message shown, or an empty record when there was not exactly one.
@@ -68,4 +69,5 @@ public:
     Script<CEventFields> editEvent;
     Script<CRecipeFields> editRecipe;
     Script<CDocumentSetFields> editDocumentSet;
+    Script<CPicResizeFields> resizePictures;
 };
