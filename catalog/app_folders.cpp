@@ -109,9 +109,10 @@ std::string CAppFolders::GetArchiveFolder(const std::string& categoryPath) const
 
 std::string CAppFolders::GetTempFolder()
 {
+    // The runtime folder is the user's own; without one, a named folder in /tmp.
     const std::string runtime = EnvValue("XDG_RUNTIME_DIR");
     const std::string folder =
-        !runtime.empty() && runtime.front() == '/'
+        !runtime.empty() && runtime.front() == '/' && IsDirectory(runtime)
             ? runtime + "/hearthbook"
             : WithoutTrailingSlash(QDir::tempPath().toStdString()) + "/hearthbook-" +
                   std::to_string(::getuid());

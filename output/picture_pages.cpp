@@ -44,7 +44,7 @@ void Grid(int picturesPerPage, int& columns, int& rows)
 
 } // namespace
 
-std::vector<QRect> PicturePageSlots(const QRect& client, const QSize& content, int picturesPerPage)
+std::vector<QRect> PicturePageCells(const QRect& client, const QSize& content, int picturesPerPage)
 {
     int columns;
     int rows;
@@ -97,7 +97,7 @@ bool PrintPictures(CPrompt& prompt, const std::vector<CPictureItem*>& pictures)
         const QRect client = painter.viewport();
         const QSize content(client.width() - 2 * kFrameWidth,
                             client.height() - 2 * kFrameWidth - kButtonStrip);
-        const std::vector<QRect> cells = PicturePageSlots(client, content, 1);
+        const std::vector<QRect> cells = PicturePageCells(client, content, 1);
         for (size_t i = 0; i < copies.size(); ++i) {
             if (i > 0)
                 device.newPage();
