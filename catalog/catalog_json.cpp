@@ -201,6 +201,54 @@ void ReadDocuments(const FieldReader& r, const char* key, CItemList& list, bool 
 
 } // namespace
 
+QJsonObject CatalogItemToJson(const CCatalogItem& item)
+{
+    if (const auto* d = dynamic_cast<const CDocumentItem*>(&item))
+        return DocumentObject(*d);
+    QJsonObject o = ItemObject(item);
+    if (const auto* r = dynamic_cast<const CRecipeItem*>(&item)) {
+        o["dish"] = Text(r->GetDish());
+        o["author"] = Text(r->GetAuthor());
+        o["directions"] = Text(r->GetDirections());
+        QJsonArray ingredients;
+        for (const CIngredient& i : r->GetIngredients()) {
+            QJsonObject io;
+            io["amount"] = Text(i.GetAmount());
+            io["measurement"] = Text(i.GetMeasurement());
+            io["ingredient"] = Text(i.GetIngredient());
+            ingredients.append(io);
+        }
+        o["ingredients"] = ingredients;
+    } else if (const auto* s = dynamic_cast<const CDocumentSet*>(&item)) {
+        o["albumFlag"] = s->GetAlbumFlag();
+        o["description"] = Text(s->GetDescription());
+        o["label"] = Text(s->GetLabel());
+        o["members"] = DocumentArray(s->GetMembers());
+        if (s->GetAlbumFlag() != 0 && s->IsAlbum()) {
+            const auto& a = static_cast<const CPhotoAlbum&>(*s);
+            o["backgroundColor"] = static_cast<qint64>(a.GetBackgroundColor());
+            o["picturesPerPage"] = a.GetPicturesPerPage();
+            o["columns"] = a.GetColumns();
+            o["displayCaption"] = a.GetDisplayCaption();
+            o["thumbnailSize"] = a.GetThumbnailSize();
+            o["displayType"] = a.GetDisplayType();
+            o["title"] = Text(a.GetTitle());
+        }
+    } else if (const auto* e = dynamic_cast<const CEventItem*>(&item)) {
+        o["eventName"] = Text(e->GetEventName());
+        o["location"] = Text(e->GetLocation());
+        o["occasion"] = Text(e->GetOccasion());
+        o["comments"] = Text(e->GetComments());
+        o["startDate"] = static_cast<qint64>(e->GetStartDate().GetTime());
+        o["endDate"] = static_cast<qint64>(e->GetEndDate().GetTime());
+        QJsonArray attendees;
+        for (const CAttendee& a : e->GetAttendees())
+            attendees.append(Text(a.GetName()));
+        o["attendees"] = attendees;
+    }
+    return o;
+}
+
 QJsonObject DumpCatalog(const CTallowmereDoc& doc)
 {
     QJsonObject root;
@@ -222,60 +270,16 @@ QJsonObject DumpCatalog(const CTallowmereDoc& doc)
     root["categories"] = categories;
 
     QJsonArray recipes;
-    for (const auto& r : doc.GetRecipes()) {
-        QJsonObject o = ItemObject(*r);
-        o["dish"] = Text(r->GetDish());
-        o["author"] = Text(r->GetAuthor());
-        o["directions"] = Text(r->GetDirections());
-        QJsonArray ingredients;
-        for (const CIngredient& i : r->GetIngredients()) {
-            QJsonObject io;
-            io["amount"] = Text(i.GetAmount());
-            io["measurement"] = Text(i.GetMeasurement());
-            io["ingredient"] = Text(i.GetIngredient());
-            ingredients.append(io);
-        }
-        o["ingredients"] = ingredients;
-        recipes.append(o);
-    }
+    for (const auto& r : doc.GetRecipes())
+        recipes.append(CatalogItemToJson(*r));
     root["recipes"] = recipes;
-
     QJsonArray sets;
-    for (const auto& s : doc.GetDocumentSets()) {
-        QJsonObject o = ItemObject(*s);
-        o["albumFlag"] = s->GetAlbumFlag();
-        o["description"] = Text(s->GetDescription());
-        o["label"] = Text(s->GetLabel());
-        o["members"] = DocumentArray(s->GetMembers());
-        if (s->GetAlbumFlag() != 0 && s->IsAlbum()) {
-            const auto& a = static_cast<const CPhotoAlbum&>(*s);
-            o["backgroundColor"] = static_cast<qint64>(a.GetBackgroundColor());
-            o["picturesPerPage"] = a.GetPicturesPerPage();
-            o["columns"] = a.GetColumns();
-            o["displayCaption"] = a.GetDisplayCaption();
-            o["thumbnailSize"] = a.GetThumbnailSize();
-            o["displayType"] = a.GetDisplayType();
-            o["title"] = Text(a.GetTitle());
-        }
-        sets.append(o);
-    }
+    for (const auto& set : doc.GetDocumentSets())
+        sets.append(CatalogItemToJson(*set));
     root["documentSets"] = sets;
-
     QJsonArray events;
-    for (const auto& e : doc.GetEvents()) {
-        QJsonObject o = ItemObject(*e);
-        o["eventName"] = Text(e->GetEventName());
-        o["location"] = Text(e->GetLocation());
-        o["occasion"] = Text(e->GetOccasion());
-        o["comments"] = Text(e->GetComments());
-        o["startDate"] = static_cast<qint64>(e->GetStartDate().GetTime());
-        o["endDate"] = static_cast<qint64>(e->GetEndDate().GetTime());
-        QJsonArray attendees;
-        for (const CAttendee& a : e->GetAttendees())
-            attendees.append(Text(a.GetName()));
-        o["attendees"] = attendees;
-        events.append(o);
-    }
+    for (const auto& e : doc.GetEvents())
+        events.append(CatalogItemToJson(*e));
     root["events"] = events;
 
     const CCatalogSettings& st = doc.GetSettings();

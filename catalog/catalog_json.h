@@ -6,9 +6,12 @@
 
 #include <string>
 
+class CCatalogItem;
 class CTallowmereDoc;
 
 QJsonObject DumpCatalog(const CTallowmereDoc& doc);
+// One item with every field it stores (and its sequence number).
+QJsonObject CatalogItemToJson(const CCatalogItem& item);
 
 // Replaces the catalog's contents with the object's. Every stored field comes
 // from the JSON (a missing key keeps its default); nothing is registered
