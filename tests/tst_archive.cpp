@@ -33,18 +33,6 @@ class TestArchive : public QObject
     Q_OBJECT
 
 private slots:
-    void numbersAreLittleEndian()
-    {
-        QCOMPARE(Written([](CArchive& ar) { ar.WriteInt(-2); }), Bytes("FE FF FF FF"));
-        QCOMPARE(Written([](CArchive& ar) { ar.WriteInt64(0x0102030405060708ll); }),
-                 Bytes("08 07 06 05 04 03 02 01"));
-        const std::string in = Bytes("FE FF FF FF 08 07 06 05 04 03 02 01");
-        CArchive ar{std::string_view(in)};
-        QCOMPARE(ar.ReadInt(), -2);
-        QCOMPARE(ar.ReadInt64(), 0x0102030405060708ll);
-        QCOMPARE(ar.BytesLeft(), 0);
-    }
-
     void timeForms_data()
     {
         QTest::addColumn<qint64>("seconds");
@@ -107,15 +95,6 @@ private slots:
     void lineWriterCannotBreakARecord()
     {
         QCOMPARE(Written([](CArchive& ar) { ar.WriteLine("a\r\nb\nc"); }), std::string("a  b c\n"));
-    }
-
-    void countedText()
-    {
-        const std::string text = "Mix.\r\nFry.";
-        const std::string out = Written([&](CArchive& ar) { ar.WriteCountedText(text); });
-        QCOMPARE(out, Bytes("0A 00 00 00") + text);
-        CArchive ar{std::string_view(out)};
-        QCOMPARE(ar.ReadCountedText(), text);
     }
 
     void cstringPrefixes_data()

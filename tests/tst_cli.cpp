@@ -54,37 +54,6 @@ private slots:
         QVERIFY(r.out.contains(QByteArray("File size: ") + QByteArray::number(before.size())));
     }
 
-    void dumpFollowsTheContract()
-    {
-        CCatalogFixture f;
-        f.WriteDataFile(LoadHexFixture("catalog/v6.hex"));
-        const CliResult r = RunCli(Home(f) + QStringList{"dump"});
-        QCOMPARE(r.exitCode, 0);
-        const QJsonObject o = QJsonDocument::fromJson(r.out).object();
-        QCOMPARE(o["formatVersion"].toInt(), 6);
-        QCOMPARE(o["creationDate"].toInteger(), 0x3F000000);
-        QCOMPARE(o["documentNumberCounter"].toInteger(), 7);
-        const QJsonObject picture = o["pictures"].toArray().at(0).toObject();
-        QCOMPARE(picture["name"].toString(), QString("Beach day"));
-        QCOMPARE(picture["fileSize"].toInteger(), 0x100001000ll);
-        QCOMPARE(picture["sequenceNumber"].toInt(), 1);
-        QCOMPARE(picture["intE"].toInt(), 5);
-        const QJsonObject album = o["documentSets"].toArray().at(0).toObject();
-        QCOMPARE(album["title"].toString(), QString("Summer 2003"));
-        QCOMPARE(album["members"].toArray().size(), 1);
-        const QJsonObject plain = o["documentSets"].toArray().at(1).toObject();
-        QCOMPARE(plain["albumFlag"].toInt(), 0);
-        QVERIFY(!plain.contains("title"));
-        const QJsonObject event = o["events"].toArray().at(0).toObject();
-        QCOMPARE(event["startDate"].toInteger(), -86400);
-        QCOMPARE(event["attendees"].toArray().at(1).toString(), QString("Bob"));
-        QCOMPARE(o["recipes"].toArray().at(0).toObject()["ingredients"].toArray().at(0)
-                     .toObject()["measurement"].toString(),
-                 QString("cups"));
-        QCOMPARE(o["settings"].toObject().keys().size(), 16);
-        QCOMPARE(o["settings"].toObject()["colorScheme"].toInt(), 1);
-    }
-
     void dumpThenImportGivesTheSameFile()
     {
         CCatalogFixture f;
