@@ -27,8 +27,7 @@ int main(int argc, char** argv)
                 for (int x = 0; x < image.width(); ++x)
                     line[x] = qRgb((x + i) & 255, (y * 2) & 255, random.bounded(64));
             }
-            image.save(QString("%1/IMG_%2.jpg").arg(args[2]).arg(i, 5, 10, QChar('0')), "JPEG",
-                       85);
+            image.save(QString("%1/IMG_%2.jpg").arg(args[2]).arg(i, 5, 10, QChar('0')), "JPEG", 85);
         }
         return 0;
     }

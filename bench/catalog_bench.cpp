@@ -18,8 +18,7 @@ namespace {
 class QuietPrompt : public CPrompt
 {
 public:
-    Answer MessageBox(const std::string& text, const std::string& caption, Icon,
-                      Buttons) override
+    Answer MessageBox(const std::string& text, const std::string& caption, Icon, Buttons) override
     {
         std::fprintf(stderr, "%s: %s\n", caption.c_str(), text.c_str());
         return Answer::No;
@@ -35,8 +34,8 @@ std::shared_ptr<CDocumentItem> MakeDocument(bool picture, int i)
         d = std::make_shared<CDocumentItem>();
     const std::string folder = "/home/ann/" + std::string(picture ? "Pictures/" : "Documents/") +
                                std::to_string(2000 + i % 20) + "/Trip " + std::to_string(i % 97);
-    const std::string name = (picture ? "IMG_" : "Letter ") + std::to_string(100000 + i) +
-                             (picture ? ".jpg" : ".pdf");
+    const std::string name =
+        (picture ? "IMG_" : "Letter ") + std::to_string(100000 + i) + (picture ? ".jpg" : ".pdf");
     d->SetPathname(folder + "/" + name);
     d->SetOriginalPathname(folder + "/" + name);
     d->SetLabel(name.substr(0, name.size() - 4));

@@ -10,8 +10,7 @@ class CAppContext
 {
 public:
     CAppContext(CPrompt& prompt, const CAppFolders& folders) : m_prompt(prompt), m_folders(folders)
-    {
-    }
+    {}
 
     CPrompt& GetPrompt() const { return m_prompt; }
     const CAppFolders& GetFolders() const { return m_folders; }

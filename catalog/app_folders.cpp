@@ -37,8 +37,7 @@ CAppFolders::CAppFolders() : m_installFolder(ResolveInstallFolder()) {}
 
 CAppFolders::CAppFolders(std::string installFolder)
     : m_installFolder(WithoutTrailingSlash(std::move(installFolder)))
-{
-}
+{}
 
 std::string CAppFolders::ResolveInstallFolder()
 {
@@ -111,11 +110,10 @@ std::string CAppFolders::GetTempFolder()
 {
     // The runtime folder is the user's own; without one, a named folder in /tmp.
     const std::string runtime = EnvValue("XDG_RUNTIME_DIR");
-    const std::string folder =
-        !runtime.empty() && runtime.front() == '/' && IsDirectory(runtime)
-            ? runtime + "/hearthbook"
-            : WithoutTrailingSlash(QDir::tempPath().toStdString()) + "/hearthbook-" +
-                  std::to_string(::getuid());
+    const std::string folder = !runtime.empty() && runtime.front() == '/' && IsDirectory(runtime)
+                                   ? runtime + "/hearthbook"
+                                   : WithoutTrailingSlash(QDir::tempPath().toStdString()) +
+                                         "/hearthbook-" + std::to_string(::getuid());
     if (::mkdir(folder.c_str(), 0700) != 0 && errno != EEXIST)
         return std::string();
     struct stat st;

@@ -16,8 +16,7 @@ constexpr size_t kBufferSize = 1 << 20;
 CArchiveException::CArchiveException(Cause cause, int64_t offset, const std::string& what,
                                      int osError)
     : std::runtime_error(what), m_cause(cause), m_offset(offset), m_osError(osError)
-{
-}
+{}
 
 CArchive::CArchive(std::string_view bytes) : m_storing(false)
 {
@@ -76,8 +75,8 @@ bool CArchive::Refill()
         got = ::read(m_fd, m_buffer.get(), want);
     } while (got < 0 && errno == EINTR);
     if (got < 0)
-        throw CArchiveException(CArchiveException::ReadFailed, m_bufferOffset,
-                                std::strerror(errno), errno);
+        throw CArchiveException(CArchiveException::ReadFailed, m_bufferOffset, std::strerror(errno),
+                                errno);
     m_end = m_buffer.get() + got;
     return got > 0;
 }
@@ -204,8 +203,7 @@ std::string CArchive::ReadCString()
     for (size_t i = 0; i < units.size(); ++i)
         units[i] = static_cast<char16_t>(static_cast<unsigned char>(text[2 * i]) |
                                          (static_cast<unsigned char>(text[2 * i + 1]) << 8));
-    return QString::fromUtf16(units.data(), static_cast<qsizetype>(units.size()))
-        .toStdString();
+    return QString::fromUtf16(units.data(), static_cast<qsizetype>(units.size())).toStdString();
 }
 
 int32_t CArchive::ReadCount(int64_t minBytesEach, const char* what)

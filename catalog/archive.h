@@ -14,7 +14,15 @@
 class CArchiveException : public std::runtime_error
 {
 public:
-    enum Cause { EndOfFile, BadLength, BadCount, BadVersion, WriteFailed, ReadFailed };
+    enum Cause
+    {
+        EndOfFile,
+        BadLength,
+        BadCount,
+        BadVersion,
+        WriteFailed,
+        ReadFailed
+    };
 
     CArchiveException(Cause cause, int64_t offset, const std::string& what, int osError = 0);
 

@@ -63,8 +63,7 @@ class FieldReader
 public:
     FieldReader(const QJsonObject& object, std::string where)
         : m_object(object), m_where(std::move(where))
-    {
-    }
+    {}
 
     std::string Name(const char* key) const { return m_where + "." + key; }
 
@@ -412,8 +411,8 @@ bool ImportCatalog(const QJsonObject& object, CTallowmereDoc& doc, std::string& 
                     throw std::runtime_error(name + " must be a string");
                 const std::string text = attendees.at(k).toString().toStdString();
                 if (HasLineBreak(text))
-                    throw std::runtime_error(name +
-                                             " holds a line break, which a line field cannot store");
+                    throw std::runtime_error(
+                        name + " holds a line break, which a line field cannot store");
                 event->GetAttendees().emplace_back(text);
             }
             doc.AddEvent(std::move(event));

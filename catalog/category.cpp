@@ -24,8 +24,7 @@ bool StartsWith(const std::string& text, const std::string& prefix)
 
 CCategory::CCategory(const std::string& name, const std::string& parentPath, int32_t depth)
     : m_parentPath(OneLine(parentPath)), m_name(OneLine(name)), m_depth(depth)
-{
-}
+{}
 
 std::string CCategory::GetPath() const
 {
@@ -116,15 +115,24 @@ void CCategoryList::AddDefaultCategories()
         const char* parent;
         int32_t depth;
     } kDefaults[] = {
-        {"RECIPES", "DOCUMENTS", 1},          {"EVENTS", "DOCUMENTS", 1},
-        {"DOCUMENT SETS", "DOCUMENTS", 1},    {"PHOTO ALBUMS", "DOCUMENTS", 1},
-        {"Appetizers", "RECIPES", 1},         {"Salads", "RECIPES\\Appetizers", 2},
-        {"Soups", "RECIPES\\Appetizers", 2},  {"Entrees", "RECIPES", 1},
-        {"Poultry", "RECIPES\\Entrees", 2},   {"Fish", "RECIPES\\Entrees", 2},
-        {"Beef", "RECIPES\\Entrees", 2},      {"Eggs", "RECIPES\\Entrees", 2},
-        {"Vegetables", "RECIPES\\Entrees", 2}, {"Deserts", "RECIPES", 1},
-        {"Cakes", "RECIPES\\Deserts", 2},     {"Birthdays", "EVENTS", 1},
-        {"Vacations", "EVENTS", 1},           {"Holidays", "EVENTS", 1},
+        {"RECIPES", "DOCUMENTS", 1},
+        {"EVENTS", "DOCUMENTS", 1},
+        {"DOCUMENT SETS", "DOCUMENTS", 1},
+        {"PHOTO ALBUMS", "DOCUMENTS", 1},
+        {"Appetizers", "RECIPES", 1},
+        {"Salads", "RECIPES\\Appetizers", 2},
+        {"Soups", "RECIPES\\Appetizers", 2},
+        {"Entrees", "RECIPES", 1},
+        {"Poultry", "RECIPES\\Entrees", 2},
+        {"Fish", "RECIPES\\Entrees", 2},
+        {"Beef", "RECIPES\\Entrees", 2},
+        {"Eggs", "RECIPES\\Entrees", 2},
+        {"Vegetables", "RECIPES\\Entrees", 2},
+        {"Deserts", "RECIPES", 1},
+        {"Cakes", "RECIPES\\Deserts", 2},
+        {"Birthdays", "EVENTS", 1},
+        {"Vacations", "EVENTS", 1},
+        {"Holidays", "EVENTS", 1},
     };
     for (const auto& d : kDefaults)
         Append(std::make_unique<CCategory>(d.name, d.parent, d.depth));

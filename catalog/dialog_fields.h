@@ -137,8 +137,21 @@ struct CDocumentSetFields
 // "Resize/Convert Picture(s)".
 struct CPicResizeFields
 {
-    enum Mode { Scale = 1, Crop = 2, Small = 3, VerySmall = 4 };
-    enum CropLocation { Center = 0, RightTop, RightBottom, LeftBottom, LeftTop };
+    enum Mode
+    {
+        Scale = 1,
+        Crop = 2,
+        Small = 3,
+        VerySmall = 4
+    };
+    enum CropLocation
+    {
+        Center = 0,
+        RightTop,
+        RightBottom,
+        LeftBottom,
+        LeftTop
+    };
 
     int mode = Scale;
     int width = 0;

@@ -52,8 +52,8 @@ int CopyRest(int in, int out)
         ssize_t n;
         if (useRange) {
             n = ::copy_file_range(in, nullptr, out, nullptr, 1 << 30, 0);
-            if (n < 0 && (errno == EXDEV || errno == ENOSYS || errno == EINVAL ||
-                          errno == EOPNOTSUPP)) {
+            if (n < 0 &&
+                (errno == EXDEV || errno == ENOSYS || errno == EINVAL || errno == EOPNOTSUPP)) {
                 useRange = false;
                 continue;
             }

@@ -36,8 +36,7 @@ CPictureItem::CPictureItem(const CDocumentItem& document)
 CPictureItem::CPictureItem(const CPictureItem& other)
     : CDocumentItem(other), m_displayCaption(other.m_displayCaption),
       m_fitToFrame(other.m_fitToFrame), m_whiteBorder(other.m_whiteBorder)
-{
-}
+{}
 
 CPictureItem::~CPictureItem() = default;
 

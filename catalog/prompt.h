@@ -11,9 +11,28 @@
 class CPrompt
 {
 public:
-    enum class Icon { None, Information, Question, Exclamation, Stop };
-    enum class Buttons { Ok, OkCancel, YesNo, YesNoCancel };
-    enum class Answer { Ok, Cancel, Yes, No };
+    enum class Icon
+    {
+        None,
+        Information,
+        Question,
+        Exclamation,
+        Stop
+    };
+    enum class Buttons
+    {
+        Ok,
+        OkCancel,
+        YesNo,
+        YesNoCancel
+    };
+    enum class Answer
+    {
+        Ok,
+        Cancel,
+        Yes,
+        No
+    };
 
     virtual ~CPrompt() = default;
 
@@ -63,9 +82,5 @@ public:
     virtual bool ResizePictures(CPicResizeFields& fields) { return Cancel(fields); }
 
 private:
-    template <typename T>
-    static bool Cancel(T&)
-    {
-        return false;
-    }
+    template <typename T> static bool Cancel(T&) { return false; }
 };

@@ -7,8 +7,7 @@ CIngredient::CIngredient(const std::string& amount, const std::string& measureme
                          const std::string& ingredient)
     : m_ingredient(OneLine(ingredient)), m_measurement(OneLine(measurement)),
       m_amount(OneLine(amount))
-{
-}
+{}
 
 void CIngredient::SetIngredient(const std::string& text)
 {

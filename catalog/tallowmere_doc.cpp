@@ -168,15 +168,14 @@ bool CTallowmereDoc::CreateCatalog()
     CAppFolders::CreateFolderPath(FolderOf(m_dataFilePath));
     const int fd = ::open(m_dataFilePath.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
     if (fd < 0) {
-        m_prompt.MessageBox("Unable to create data file", "Create Data File",
-                            CPrompt::Icon::Stop);
+        m_prompt.MessageBox("Unable to create data file", "Create Data File", CPrompt::Icon::Stop);
         return false;
     }
     ::close(fd);
     RemoveAll();
     CFileStatus status;
     m_creationDate = CFileStatus::GetStatus(m_dataFilePath, status) ? status.createTime
-                                                                     : CTime::GetCurrentTime();
+                                                                    : CTime::GetCurrentTime();
     m_categories.AddDefaultCategories();
     m_documentNumberCounter = 0;
     m_prompt.ShowReadMe(ReadMeText());

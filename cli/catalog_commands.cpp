@@ -81,7 +81,8 @@ int RunImportJson(CliContext& c)
         return c.Usage(QStringLiteral("import-json takes one JSON file"));
     QFile file(c.arguments.at(0));
     if (!file.open(QIODevice::ReadOnly))
-        return c.Failure(QStringLiteral("cannot read %1: %2").arg(file.fileName(), file.errorString()));
+        return c.Failure(
+            QStringLiteral("cannot read %1: %2").arg(file.fileName(), file.errorString()));
     QJsonParseError parseError;
     const QJsonDocument json = QJsonDocument::fromJson(file.readAll(), &parseError);
     if (json.isNull())
@@ -93,21 +94,22 @@ int RunImportJson(CliContext& c)
     CTallowmereDoc doc(c.prompt, c.folders, c.catalogPath);
     std::string error;
     if (!ImportCatalog(json.object(), doc, error))
-        return c.Failure(QStringLiteral("%1: %2").arg(file.fileName(), QString::fromStdString(error)));
+        return c.Failure(
+            QStringLiteral("%1: %2").arg(file.fileName(), QString::fromStdString(error)));
     CAppFolders::CreateFolderPath(FolderOf(c.catalogPath));
     if (!doc.SaveCatalog(false))
         return kExitFailure;
     std::printf("Imported %zu pictures, %zu documents, %zu document sets, %zu events, %zu "
                 "recipes and %zu categories into %s\n",
-                doc.GetPictures().size(), doc.GetDocuments().size(),
-                doc.GetDocumentSets().size(), doc.GetEvents().size(), doc.GetRecipes().size(),
-                doc.GetCategories().size(), c.catalogPath.c_str());
+                doc.GetPictures().size(), doc.GetDocuments().size(), doc.GetDocumentSets().size(),
+                doc.GetEvents().size(), doc.GetRecipes().size(), doc.GetCategories().size(),
+                c.catalogPath.c_str());
     return kExitOk;
 }
 
 const CliRegistration kInit{{QStringLiteral("init"), QString(),
-                             QStringLiteral("Make the folders and create a new catalog."),
-                             nullptr, RunInit}};
+                             QStringLiteral("Make the folders and create a new catalog."), nullptr,
+                             RunInit}};
 const CliRegistration kInfo{{QStringLiteral("info"), QString(),
                              QStringLiteral("Counts of each kind, categories, format version, "
                                             "file size."),

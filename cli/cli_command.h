@@ -15,7 +15,13 @@
 class CConsolePrompt;
 class CTallowmereDoc;
 
-enum CliExit { kExitOk = 0, kExitUsage = 1, kExitCatalog = 2, kExitFailure = 3 };
+enum CliExit
+{
+    kExitOk = 0,
+    kExitUsage = 1,
+    kExitCatalog = 2,
+    kExitFailure = 3
+};
 
 struct CliContext
 {

@@ -11,8 +11,7 @@ class CConsolePrompt : public CPrompt
 {
 public:
     explicit CConsolePrompt(Answer questionAnswer = Answer::No) : m_questionAnswer(questionAnswer)
-    {
-    }
+    {}
 
     Answer MessageBox(const std::string& text, const std::string& caption, Icon icon,
                       Buttons buttons) override;

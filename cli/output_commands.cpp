@@ -38,9 +38,8 @@ int OpenWithItems(const CliContext& c, std::unique_ptr<CTallowmereDoc>& doc,
 }
 
 // The one item of a command that writes pages into --folder.
-int OpenWithPageItem(const CliContext& c, const QString& what,
-                     std::unique_ptr<CTallowmereDoc>& doc, CCatalogItem*& item,
-                     std::string& folder)
+int OpenWithPageItem(const CliContext& c, const QString& what, std::unique_ptr<CTallowmereDoc>& doc,
+                     CCatalogItem*& item, std::string& folder)
 {
     if (c.arguments.size() != 1 || !c.parser.isSet(QStringLiteral("folder")))
         return c.Usage(QStringLiteral("%1 takes one item and --folder DIR").arg(what));
@@ -172,8 +171,8 @@ int RunMail(CliContext& c)
         if (document && document->IsPicture())
             pictures.push_back(static_cast<CPictureItem*>(document));
         else if (document)
-            documents.push_back({document->GetPathname(),
-                                 CMapiMail::DisplayName(document->GetPathname())});
+            documents.push_back(
+                {document->GetPathname(), CMapiMail::DisplayName(document->GetPathname())});
         else
             item->Mail(doc->GetContext());
     }
@@ -196,8 +195,8 @@ int RunPrintPictures(CliContext& c)
     for (CCatalogItem* item : items) {
         auto* document = dynamic_cast<CDocumentItem*>(item);
         if (!document || !document->IsPicture())
-            return c.Failure(QStringLiteral("item %1 is not a picture")
-                                 .arg(item->GetSequenceNumber()));
+            return c.Failure(
+                QStringLiteral("item %1 is not a picture").arg(item->GetSequenceNumber()));
         pictures.push_back(static_cast<CPictureItem*>(document));
     }
     c.prompt.SetPdfFile(c.parser.value(QStringLiteral("pdf")).toStdString());
@@ -225,9 +224,8 @@ void TextOptions(QCommandLineParser& parser)
 
 void PrintOptions(QCommandLineParser& parser)
 {
-    parser.addOption(QCommandLineOption(QStringLiteral("pdf"),
-                                        QStringLiteral("Print into a PDF file."),
-                                        QStringLiteral("FILE")));
+    parser.addOption(QCommandLineOption(
+        QStringLiteral("pdf"), QStringLiteral("Print into a PDF file."), QStringLiteral("FILE")));
     parser.addOption(QCommandLineOption(QStringLiteral("printer"),
                                         QStringLiteral("Print on a CUPS queue."),
                                         QStringLiteral("QUEUE")));

@@ -72,8 +72,9 @@ bool DrawTextPages(QPagedPaintDevice& device, const std::vector<CPrintPage>& pag
 bool PrintDataItems(CPrompt& prompt, const std::vector<const CCatalogItem*>& items)
 {
     const std::vector<CPrintPage> pages = LayOutDataItemPages(items);
-    return RunPrintJob(prompt, "Quillery",
-                       [&pages](QPagedPaintDevice& device) { return DrawTextPages(device, pages); });
+    return RunPrintJob(prompt, "Quillery", [&pages](QPagedPaintDevice& device) {
+        return DrawTextPages(device, pages);
+    });
 }
 
 int AssignPrintPages(const std::vector<CCatalogItem*>& items)

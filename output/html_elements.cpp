@@ -94,9 +94,9 @@ std::string CHtmlTable::Render() const
 {
     const std::string heightAttr = height.empty() ? std::string() : "height=" + height;
     const std::string widthAttr = width.empty() ? std::string() : "width=" + width;
-    std::string out = StrFormat("\n<table align=center %s %s cellspacing=%d border=%d cellpadding=%d>",
-                                widthAttr.c_str(), heightAttr.c_str(), cellSpacing, border,
-                                cellPadding);
+    std::string out =
+        StrFormat("\n<table align=center %s %s cellspacing=%d border=%d cellpadding=%d>",
+                  widthAttr.c_str(), heightAttr.c_str(), cellSpacing, border, cellPadding);
     for (const auto& row : m_rows)
         out += row->Render();
     out += "\n</table>";

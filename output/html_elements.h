@@ -13,7 +13,12 @@ std::string HtmlEscape(const std::string& text);
 class CHtmlCell
 {
 public:
-    enum Kind { CellText = 1, CellLink = 2, CellImage = 3 };
+    enum Kind
+    {
+        CellText = 1,
+        CellLink = 2,
+        CellImage = 3
+    };
 
     void SetFont(const std::string& color, const std::string& face, int size);
     std::string Render() const;

@@ -15,9 +15,8 @@ CMapiMail::CMapiMail(CPrompt& prompt) : m_prompt(prompt)
     const char* replacement = std::getenv("HEARTHBOOK_MAIL_COMMAND");
     const QString wanted = replacement && *replacement ? QString::fromLocal8Bit(replacement)
                                                        : QStringLiteral("xdg-email");
-    const QString found = wanted.contains(QLatin1Char('/'))
-                              ? wanted
-                              : QStandardPaths::findExecutable(wanted);
+    const QString found =
+        wanted.contains(QLatin1Char('/')) ? wanted : QStandardPaths::findExecutable(wanted);
     struct stat st;
     if (found.isEmpty() || ::stat(found.toLocal8Bit().constData(), &st) != 0)
         return;
@@ -75,9 +74,9 @@ bool CMapiMail::Send(int flags)
     QProcess process;
     process.start(QString::fromStdString(m_program), arguments);
     if (!process.waitForStarted()) {
-        m_prompt.MessageBox(StrFormat("Error! The mail program %s could not be started.",
-                                      m_program.c_str()),
-                            "Send Mail", CPrompt::Icon::Stop);
+        m_prompt.MessageBox(
+            StrFormat("Error! The mail program %s could not be started.", m_program.c_str()),
+            "Send Mail", CPrompt::Icon::Stop);
         return false;
     }
     process.closeWriteChannel();

@@ -15,8 +15,7 @@ class QPainter;
 // 1 a page is 1 x 1, 2 is 1 x 2, 4 is 2 x 2, 6 is 2 x 3, 8 is 2 x 4, any other
 // number 2 x 3 (columns x rows). Each cell is shrunk by 10 on every side and
 // 30 more at its bottom.
-std::vector<QRect> PicturePageCells(const QRect& client, const QSize& content,
-                                    int picturesPerPage);
+std::vector<QRect> PicturePageCells(const QRect& client, const QSize& content, int picturesPerPage);
 
 // Draws the pictures of one page into the cells, with their captions in
 // Arial 10 pt, dark red. A picture without a path leaves its slot empty.

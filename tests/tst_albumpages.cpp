@@ -74,8 +74,8 @@ public:
 QByteArray Image(const char* name, int width, int height)
 {
     return QByteArray("\n<td align=center bgcolor=white><image width = ") +
-           QByteArray::number(width) + " height = " + QByteArray::number(height) + " name=" +
-           name + " src=" + name + " bgcolor=white>\n</td>";
+           QByteArray::number(width) + " height = " + QByteArray::number(height) + " name=" + name +
+           " src=" + name + " bgcolor=white>\n</td>";
 }
 
 QByteArray Caption(const char* text)
@@ -104,22 +104,23 @@ private slots:
         QVERIFY(f.Create());
         QCOMPARE(f.album.GetColumns(), 2);
         QCOMPARE(f.Generated(), (QStringList{"Pic_0001.png", "Pic_0002.png", "Page_000.html",
-                                            "Pic_0003.png", "Pic_0004.png", "Page_001.html",
-                                            "Pic_0005.png", "Page_002.html", "Summer.html"}));
+                                             "Pic_0003.png", "Pic_0004.png", "Page_001.html",
+                                             "Pic_0005.png", "Page_002.html", "Summer.html"}));
         QCOMPARE(QString::fromStdString(f.album.GetIndexPath()), f.Out() + "/Summer.html");
         QCOMPARE(QString::fromStdString(f.album.GetIndexFileName()), QString("Summer.html"));
         QVERIFY(QFile::exists(f.Out() + "/Pic_0005.png"));
         QVERIFY(f.Page(0).contains("\n<tr>" + Image("Pic_0001.png", 200, 150) +
                                    Image("Pic_0002.png", 200, 150) + "\n</tr>\n<tr>" + kEmptyNav +
                                    Link("Next", "Page_001.html") + "\n</tr>\n</table>"));
-        QVERIFY(f.Page(1).contains(Link("Previous", "Page_000.html") + Link("Next", "Page_002.html")));
+        QVERIFY(
+            f.Page(1).contains(Link("Previous", "Page_000.html") + Link("Next", "Page_002.html")));
         QVERIFY(f.Page(2).contains("\n<tr>" + Image("Pic_0005.png", 200, 150) + "\n</tr>\n<tr>" +
                                    Link("Previous", "Page_001.html") + kEmptyNav + "\n</tr>"));
         QVERIFY(f.Page(0).contains("<BODY bgcolor=#ff0000 >"));
         QFile index(f.Out() + "/Summer.html");
         QVERIFY(index.open(QIODevice::ReadOnly));
-        QVERIFY(index.readAll().endsWith(
-            "\n<Frameset>\n<Frame src=\"Page_000.html\", name=Page_000.html>\n</Frameset>\n</HTML>"));
+        QVERIFY(index.readAll().endsWith("\n<Frameset>\n<Frame src=\"Page_000.html\", "
+                                         "name=Page_000.html>\n</Frameset>\n</HTML>"));
     }
 
     void captionsWaitForAFullRow()
@@ -153,7 +154,7 @@ private slots:
         f.AddPicture("scan.TIF", "tif");
         QVERIFY(f.Create());
         QVERIFY(f.Page(1).contains("\n<tr>" + Image("Pic_0005.png", 200, 150)));
-        QVERIFY(f.Generated().contains("Pic_0006."));  // four letters after the dot: none kept
+        QVERIFY(f.Generated().contains("Pic_0006.")); // four letters after the dot: none kept
         QVERIFY(f.Generated().contains("Pic_0007.TIF"));
         QVERIFY(QFile::exists(f.Out() + "/Pic_0006."));
     }
@@ -170,12 +171,18 @@ private slots:
     {
         QTest::addColumn<QString>("title");
         QTest::addColumn<QString>("index");
-        QTest::newRow("first word") << "Summer 2003" << "Summer.html";
-        QTest::newRow("one word") << "Vacation" << "Title.html";
-        QTest::newRow("empty") << "" << "Title.html";
-        QTest::newRow("leading blank") << " Summer" << "Title.html";
-        QTest::newRow("climbing") << "../../x y" << "_._.._x.html";
-        QTest::newRow("hidden") << ".profile y" << "_profile.html";
+        QTest::newRow("first word") << "Summer 2003"
+                                    << "Summer.html";
+        QTest::newRow("one word") << "Vacation"
+                                  << "Title.html";
+        QTest::newRow("empty") << ""
+                               << "Title.html";
+        QTest::newRow("leading blank") << " Summer"
+                                       << "Title.html";
+        QTest::newRow("climbing") << "../../x y"
+                                  << "_._.._x.html";
+        QTest::newRow("hidden") << ".profile y"
+                                << "_profile.html";
     }
 
     void indexNames()
@@ -197,7 +204,8 @@ private slots:
         QTest::newRow("too tall") << 1 << QSize(100, 300) << QSize(66, 200);
         QTest::newRow("too wide") << 1 << QSize(300, 100) << QSize(200, 66);
         QTest::newRow("odd unused height") << 1 << QSize(300, 101) << QSize(200, 68);
-        QTest::newRow("unknown thumbnail size is medium") << 7 << QSize(400, 300) << QSize(200, 150);
+        QTest::newRow("unknown thumbnail size is medium")
+            << 7 << QSize(400, 300) << QSize(200, 150);
         QTest::newRow("unreadable picture fills the box") << 1 << QSize(0, 0) << QSize(200, 200);
     }
 

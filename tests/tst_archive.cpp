@@ -17,8 +17,7 @@ std::string Bytes(const char* hex)
     return ParseHexFixture(QByteArray(hex)).toStdString();
 }
 
-template <typename Write>
-std::string Written(Write write)
+template <typename Write> std::string Written(Write write)
 {
     std::string out;
     CArchive ar(&out);
@@ -144,8 +143,8 @@ private slots:
             << ParseHexFixture("FF FE FF 02 41 00") << 1 << int(CArchiveException::BadLength);
         QTest::newRow("negative count")
             << ParseHexFixture("FF FF FF 80") << 2 << int(CArchiveException::BadCount);
-        QTest::newRow("count the file cannot hold")
-            << ParseHexFixture("03 00 00 00 0A 0A 0A 0A 0A") << 2 << int(CArchiveException::BadCount);
+        QTest::newRow("count the file cannot hold") << ParseHexFixture("03 00 00 00 0A 0A 0A 0A 0A")
+                                                    << 2 << int(CArchiveException::BadCount);
         QTest::newRow("int cut short")
             << ParseHexFixture("01 00") << 2 << int(CArchiveException::EndOfFile);
     }

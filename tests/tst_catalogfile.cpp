@@ -3,8 +3,8 @@
 // the previous catalog.
 
 #include "catalog/archive.h"
-#include "tests/support/catalog_fixture.h"
 #include "catalog/catalog_json.h"
+#include "tests/support/catalog_fixture.h"
 #include "tests/support/expectations.h"
 #include "tests/support/hex_fixture.h"
 
@@ -21,8 +21,7 @@ const std::string kReadData = "Read Data";
 
 QStringList Leftovers(const std::string& folder)
 {
-    return QDir(QString::fromStdString(folder))
-        .entryList({"*.new*"}, QDir::Files | QDir::Hidden);
+    return QDir(QString::fromStdString(folder)).entryList({"*.new*"}, QDir::Files | QDir::Hidden);
 }
 
 // Small hand-written headers for the damaged-file cases.
@@ -68,7 +67,8 @@ private slots:
         QVERIFY(doc);
         QCOMPARE(doc->GetSequenceCounter(), 7);
         // Pictures are read before the settings, so they keep the default.
-        QCOMPARE(static_cast<const CPictureItem&>(*doc->GetPictures().at(0)).GetDisplayCaption(), 1);
+        QCOMPARE(static_cast<const CPictureItem&>(*doc->GetPictures().at(0)).GetDisplayCaption(),
+                 1);
         // The views' colour waits for the preferences to be confirmed.
         QCOMPARE(doc->GetBackgroundColor(), 0xD0C0C0u);
         QVERIFY(doc->GetDocumentSets().at(0)->IsAlbum());
@@ -157,8 +157,9 @@ private slots:
             << one + ParseHexFixture("FF FF FF 7F") + QByteArray(100, '\n')
             << "picture count of 2147483647";
         QTest::newRow("comments longer than the file")
-            << one + ParseHexFixture("00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00"
-                                     "01 00 00 00 0A 0A 0A F0 FF FF 7F") +
+            << one +
+                   ParseHexFixture("00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00 00"
+                                   "01 00 00 00 0A 0A 0A F0 FF FF 7F") +
                    QByteArray(60, '\0')
             << "text length of 2147483632";
     }
@@ -205,9 +206,11 @@ private slots:
         QTest::addColumn<QString>("text");
         QTest::addColumn<QString>("caption");
         QTest::newRow("missing, not to be created")
-            << 0 << "Unable to open %1 file! The file could not be located." << "Read Data";
+            << 0 << "Unable to open %1 file! The file could not be located."
+            << "Read Data";
         QTest::newRow("a folder in its place")
-            << 1 << "Unable to open %1 file! The file could not be accessed." << "Read Data";
+            << 1 << "Unable to open %1 file! The file could not be accessed."
+            << "Read Data";
         QTest::newRow("cannot be created") << 2 << "Unable to create data file"
                                            << "Create Data File";
     }
@@ -222,8 +225,8 @@ private slots:
         if (situation == 1)
             QDir().mkpath(QString::fromStdString(path));
         if (situation == 2) // a dangling link: missing, and creating it fails
-            QVERIFY(QFile::link(f.dir.path() + "/no such folder/x.hbi",
-                                QString::fromStdString(path)));
+            QVERIFY(
+                QFile::link(f.dir.path() + "/no such folder/x.hbi", QString::fromStdString(path)));
         CTallowmereDoc doc(f.prompt, CAppFolders(f.Home()), path);
         QVERIFY(!(situation == 0 ? doc.OpenCatalog(false) : doc.StartUp()));
         if (text.contains("%1"))
@@ -273,7 +276,8 @@ private slots:
         std::signal(SIGXFSZ, oldHandler);
         QVERIFY(!saved);
         QCOMPARE(QString::fromStdString(f.prompt.Only().text),
-                 QString("Unable to open %1 file! Disk Full.").arg(QString::fromStdString(f.DataFile())));
+                 QString("Unable to open %1 file! Disk Full.")
+                     .arg(QString::fromStdString(f.DataFile())));
         QCOMPARE(f.prompt.Only().caption, std::string("Save"));
         QCOMPARE(f.ReadDataFile(), before);
         QVERIFY(Leftovers(f.Home() + "/User Data").isEmpty());

@@ -56,7 +56,8 @@ private slots:
         CCategoryList list = Defaults();
         QCOMPARE(list.EnsureCategoryPath("DOCUMENTS\\Work\\2003"), 1);
         QCOMPARE(list.size(), size_t(20));
-        QCOMPARE(Paths(list).mid(18), (QStringList{"DOCUMENTS\\Work:1", "DOCUMENTS\\Work\\2003:2"}));
+        QCOMPARE(Paths(list).mid(18),
+                 (QStringList{"DOCUMENTS\\Work:1", "DOCUMENTS\\Work\\2003:2"}));
         list.EnsureCategoryPath("DOCUMENTS\\Work\\2003");
         QCOMPARE(list.size(), size_t(20));
         list.EnsureCategoryPath("DOCUMENTS\\Work\\2004");
@@ -98,10 +99,10 @@ private slots:
     {
         QTest::addColumn<QString>("root");
         QTest::addColumn<QStringList>("paths");
-        QTest::newRow("documents") << "DOCUMENTS"
-                                   << QStringList{"DOCUMENTS\\RECIPES", "DOCUMENTS\\EVENTS",
-                                                  "DOCUMENTS\\DOCUMENT SETS",
-                                                  "DOCUMENTS\\PHOTO ALBUMS", "DOCUMENTS\\Work"};
+        QTest::newRow("documents")
+            << "DOCUMENTS"
+            << QStringList{"DOCUMENTS\\RECIPES", "DOCUMENTS\\EVENTS", "DOCUMENTS\\DOCUMENT SETS",
+                           "DOCUMENTS\\PHOTO ALBUMS", "DOCUMENTS\\Work"};
         QTest::newRow("events") << "EVENTS"
                                 << QStringList{"EVENTS\\Birthdays", "EVENTS\\Vacations",
                                                "EVENTS\\Holidays"};
@@ -156,8 +157,8 @@ private slots:
         CCategoryList list;
         for (const QString& c : categories) {
             const QStringList f = c.split('|');
-            list.Append(std::make_unique<CCategory>(f[0].toStdString(), f[1].toStdString(),
-                                                    f[2].toInt()));
+            list.Append(
+                std::make_unique<CCategory>(f[0].toStdString(), f[1].toStdString(), f[2].toInt()));
         }
         CTextTree built;
         BuildCategoryTree(built, list, "EVENTS");

@@ -79,8 +79,10 @@ private slots:
         doc->AddCategory("Caf\xE9 \x80", "EVENTS", 0);
         QVERIFY(doc->SaveCatalog(false));
         const CliResult r = RunCli(Home(f) + QStringList{"dump"});
-        const QJsonArray categories = QJsonDocument::fromJson(r.out).object()["categories"].toArray();
-        QCOMPARE(categories.last().toObject()["name"].toString(), QString::fromUtf8("Caf\u00e9 \u20ac"));
+        const QJsonArray categories =
+            QJsonDocument::fromJson(r.out).object()["categories"].toArray();
+        QCOMPARE(categories.last().toObject()["name"].toString(),
+                 QString::fromUtf8("Caf\u00e9 \u20ac"));
     }
 
     void outputCommands()
@@ -89,8 +91,8 @@ private slots:
         f.WriteDataFile(LoadHexFixture("catalog/v6.hex"));
         const auto doc = f.Open();
         QVERIFY(doc);
-        const std::string expected = doc->FindItemBySequence(3)->GetMailText() +
-                                     doc->FindItemBySequence(6)->GetMailText();
+        const std::string expected =
+            doc->FindItemBySequence(3)->GetMailText() + doc->FindItemBySequence(6)->GetMailText();
         CliResult r = RunCli(Home(f) + QStringList{"text", "3", "6"});
         QCOMPARE(r.exitCode, 0);
         QCOMPARE(r.out.toStdString(), expected);
@@ -128,28 +130,27 @@ private slots:
         QTest::addColumn<int>("code");
         QTest::addColumn<QString>("message");
         const QByteArray v6 = LoadHexFixture("catalog/v6.hex");
-        QTest::newRow("no command") << QStringList{} << QByteArray() << QByteArray() << 1
-                                    << "no command given";
+        QTest::newRow("no command")
+            << QStringList{} << QByteArray() << QByteArray() << 1 << "no command given";
         QTest::newRow("unknown command") << QStringList{"frobnicate"} << QByteArray()
                                          << QByteArray() << 1 << "unknown command 'frobnicate'";
         QTest::newRow("unknown option") << QStringList{"info", "--frob"} << QByteArray()
                                         << QByteArray() << 1 << "Unknown option 'frob'";
-        QTest::newRow("stray argument") << QStringList{"info", "extra"} << v6 << QByteArray() << 1
-                                        << "info takes no arguments";
-        QTest::newRow("missing catalog") << QStringList{"info"} << QByteArray() << QByteArray()
-                                         << 2 << "file! The file could not be located.";
-        QTest::newRow("damaged catalog") << QStringList{"dump"} << v6.left(300) << QByteArray()
-                                         << 2 << "Read Data: Unable to read";
+        QTest::newRow("stray argument")
+            << QStringList{"info", "extra"} << v6 << QByteArray() << 1 << "info takes no arguments";
+        QTest::newRow("missing catalog") << QStringList{"info"} << QByteArray() << QByteArray() << 2
+                                         << "file! The file could not be located.";
+        QTest::newRow("damaged catalog") << QStringList{"dump"} << v6.left(300) << QByteArray() << 2
+                                         << "Read Data: Unable to read";
         QTest::newRow("not JSON") << QStringList{"import-json", "in.json"} << QByteArray()
                                   << QByteArray("{ nope") << 3 << "is not valid JSON";
         QTest::newRow("line break in a line field")
             << QStringList{"import-json", "in.json"} << QByteArray()
             << QByteArray(R"({"pictures":[{"name":"a\nb"}]})") << 3
             << "catalog.pictures[0].name holds a line break";
-        QTest::newRow("wrong type")
-            << QStringList{"import-json", "in.json"} << QByteArray()
-            << QByteArray(R"({"events":[{"startDate":"today"}]})") << 3
-            << "catalog.events[0].startDate must be a whole number";
+        QTest::newRow("wrong type") << QStringList{"import-json", "in.json"} << QByteArray()
+                                    << QByteArray(R"({"events":[{"startDate":"today"}]})") << 3
+                                    << "catalog.events[0].startDate must be a whole number";
         QTest::newRow("version") << QStringList{"--version"} << QByteArray() << QByteArray() << 0
                                  << "";
     }

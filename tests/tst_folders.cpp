@@ -93,10 +93,14 @@ private slots:
     {
         QTest::addColumn<QString>("category");
         QTest::addColumn<QString>("folder");
-        QTest::newRow("nested") << "DOCUMENTS\\Letters\\2002" << "DOCUMENTS/Letters/2002";
-        QTest::newRow("climbing parts") << "DOCUMENTS\\..\\..\\etc" << "DOCUMENTS/_/_/etc";
-        QTest::newRow("slash in a name") << "DOCUMENTS\\a/b" << "DOCUMENTS/a_b";
-        QTest::newRow("empty part") << "DOCUMENTS\\\\x" << "DOCUMENTS/_/x";
+        QTest::newRow("nested") << "DOCUMENTS\\Letters\\2002"
+                                << "DOCUMENTS/Letters/2002";
+        QTest::newRow("climbing parts") << "DOCUMENTS\\..\\..\\etc"
+                                        << "DOCUMENTS/_/_/etc";
+        QTest::newRow("slash in a name") << "DOCUMENTS\\a/b"
+                                         << "DOCUMENTS/a_b";
+        QTest::newRow("empty part") << "DOCUMENTS\\\\x"
+                                    << "DOCUMENTS/_/x";
     }
 
     void categoryFolders()
@@ -141,7 +145,8 @@ private slots:
         QCOMPARE(QString::fromStdString(folders.GetInstallFolder()), dir.path() + "/env");
         QCOMPARE(QString::fromStdString(folders.GetDataFilePath()),
                  dir.path() + "/env/User Data/HearthbookInfo.hbi");
-        QCOMPARE(QString::fromStdString(folders.GetImagesFolder()), dir.path() + "/env/Data/Images");
+        QCOMPARE(QString::fromStdString(folders.GetImagesFolder()),
+                 dir.path() + "/env/Data/Images");
         settings.remove("InstallPath");
         qputenv("HEARTHBOOK_HOME", savedHome);
         qputenv("XDG_DATA_HOME", savedData);
@@ -184,7 +189,8 @@ private slots:
         const CFileEntry entry(root.toStdString(), source.toStdString());
         CScriptedPrompt prompt;
 
-        const QString first = QString::fromStdString(entry.ArchiveFile(prompt, false, kJuly5At1407));
+        const QString first =
+            QString::fromStdString(entry.ArchiveFile(prompt, false, kJuly5At1407));
         QCOMPARE(first, root + dir.path() + "/Photos/2003/Beach-0307051407.jpg");
         QCOMPARE(ReadFile(first), QByteArray("picture bytes"));
         CFileStatus status;
@@ -241,7 +247,8 @@ private slots:
         CScriptedPrompt prompt;
         QVERIFY(entry.ArchiveFile(prompt, true, kJuly5At1407).empty());
         const QString target = root + dir.path() + "/in";
-        text = text.replace("%1", target).replace("%2", source)
+        text = text.replace("%1", target)
+                   .replace("%2", source)
                    .replace("%3", target + "/gone-0307051407.txt");
         QCOMPARE(QString::fromStdString(prompt.Only().text), text);
         QCOMPARE(prompt.Only().caption, std::string("Archive File"));
@@ -268,7 +275,7 @@ private slots:
         WriteFile(d + "/x.txt", "x");
         WriteFile(d + "/s/y.txt", "y");
         WriteFile(d + "/s/t/z.jpg", "z");
-        QVERIFY(QFile::link(d, d + "/s/loop"));            // a link back up: not followed
+        QVERIFY(QFile::link(d, d + "/s/loop"));              // a link back up: not followed
         QVERIFY(QFile::link(d + "/x.txt", d + "/s/x-link")); // a link to a file: a file
         QVERIFY(QFile::link(d + "/nothing", d + "/dangling"));
         QCOMPARE(::mkfifo((d + "/pipe").toLocal8Bit().constData(), 0600), 0);

@@ -28,8 +28,8 @@ private slots:
         QVERIFY(file.open(QIODevice::ReadOnly));
         const QByteArray bytes = file.readAll();
         // Aborts on a broken property; a file named ok-* must also read.
-        const bool read = fuzzing::CheckCatalogBytes(std::string_view(bytes.constData(),
-                                                                      bytes.size()));
+        const bool read =
+            fuzzing::CheckCatalogBytes(std::string_view(bytes.constData(), bytes.size()));
         if (QFileInfo(path).fileName().startsWith("ok-"))
             QVERIFY(read);
     }

@@ -82,12 +82,18 @@ private slots:
     {
         QTest::addColumn<QString>("path");
         QTest::addColumn<QString>("label");
-        QTest::newRow("with extension") << "/a/letter.doc" << "letter";
-        QTest::newRow("no extension loses four characters") << "/a/readme" << "re";
-        QTest::newRow("relative") << "readme.txt" << "readme";
-        QTest::newRow("four characters") << "a.tx" << "";
-        QTest::newRow("top folder") << "/x.doc" << "x";
-        QTest::newRow("dot in folder") << "/pics.old/photo.jpeg" << "photo.";
+        QTest::newRow("with extension") << "/a/letter.doc"
+                                        << "letter";
+        QTest::newRow("no extension loses four characters") << "/a/readme"
+                                                            << "re";
+        QTest::newRow("relative") << "readme.txt"
+                                  << "readme";
+        QTest::newRow("four characters") << "a.tx"
+                                         << "";
+        QTest::newRow("top folder") << "/x.doc"
+                                    << "x";
+        QTest::newRow("dot in folder") << "/pics.old/photo.jpeg"
+                                       << "photo.";
     }
 
     void labelFromPath()
@@ -114,7 +120,7 @@ private slots:
         const CDocumentItem document;
         const CEventItem event;
         QVERIFY(document.GetUpdateDate() >= before); // documents start updated now
-        QCOMPARE(event.GetUpdateDate(), CTime());     // the other kinds with zero
+        QCOMPARE(event.GetUpdateDate(), CTime());    // the other kinds with zero
         QVERIFY(event.GetCreateDate() >= before);
         QCOMPARE(CDocumentSet().GetCategoryPath(), std::string("DOCUMENT SETS"));
     }
@@ -333,7 +339,8 @@ private slots:
         CEventItem event;
         const std::string e = Store(event);
         // three empty lines, then the comments' length 0 and no bytes
-        QCOMPARE(QByteArray::fromStdString(e.substr(0, 7)), ParseHexFixture("0A 0A 0A 00 00 00 00"));
+        QCOMPARE(QByteArray::fromStdString(e.substr(0, 7)),
+                 ParseHexFixture("0A 0A 0A 00 00 00 00"));
         CRecipeItem recipe;
         const std::string r = Store(recipe);
         // two empty lines, directions length 0, ingredient count 0, then the common record
@@ -350,8 +357,8 @@ private slots:
         QTest::newRow("empty") << QByteArray() << ParseHexFixture("00 00 00 00") << QByteArray();
         QTest::newRow("one character keeps a blank")
             << QByteArray("x") << ParseHexFixture("02 00 00 00 \"x \"") << QByteArray("x ");
-        QTest::newRow("two characters") << QByteArray("\r\n") << ParseHexFixture("02 00 00 00 0D 0A")
-                                        << QByteArray("\r\n");
+        QTest::newRow("two characters")
+            << QByteArray("\r\n") << ParseHexFixture("02 00 00 00 0D 0A") << QByteArray("\r\n");
     }
 
     void descriptionLengths()
@@ -404,8 +411,8 @@ private slots:
         QTest::addColumn<QString>("comments");
         QTest::addColumn<QStringList>("tail");
         QTest::newRow("empty comments give one empty line") << "" << QStringList{""};
-        QTest::newRow("trailing pair ends with an empty line")
-            << "Cake\r\n" << QStringList{"Cake", ""};
+        QTest::newRow("trailing pair ends with an empty line") << "Cake\r\n"
+                                                               << QStringList{"Cake", ""};
         QTest::newRow("empty stretch") << "a\r\n\r\nb" << QStringList{"a", "", "b"};
         QTest::newRow("lone LF stays in its line") << "a\nb" << QStringList{"a\nb"};
     }

@@ -100,9 +100,9 @@ private slots:
         }
         QFile::remove(m_dir.path() + "/two.pdf"); // a deleted member is left out
         set.Mail(context);
-        QCOMPARE(Recorded(), (QStringList{"--subject", "", "--body", "Taxes 2003  ", "--attach",
-                                          m_dir.path() + "/one.pdf", "--attach",
-                                          m_dir.path() + "/three.pdf"}));
+        QCOMPARE(Recorded(),
+                 (QStringList{"--subject", "", "--body", "Taxes 2003  ", "--attach",
+                              m_dir.path() + "/one.pdf", "--attach", m_dir.path() + "/three.pdf"}));
         QVERIFY(MailSupport(prompt));
         QCOMPARE(Recorded(), (QStringList{"--subject", "Hearthbook support issue", "--body", "",
                                           "support@hearthbook.example"}));

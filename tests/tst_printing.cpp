@@ -118,8 +118,7 @@ private slots:
         QTest::addColumn<int>("pageCount");
         QTest::newRow("three recipes") << QList<int>{30, 30, 30} << QList<int>{1, 1, 2} << 2;
         QTest::newRow("twenty plain items fit") << QList<int>(20, 0) << QList<int>(20, 1) << 1;
-        QTest::newRow("the 21st does not")
-            << QList<int>(21, 0) << (QList<int>(20, 1) << 2) << 2;
+        QTest::newRow("the 21st does not") << QList<int>(21, 0) << (QList<int>(20, 1) << 2) << 2;
         QTest::newRow("an item longer than two pages")
             << QList<int>{30, 170, 0} << QList<int>{1, 2, 4} << 4;
     }

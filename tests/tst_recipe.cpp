@@ -74,8 +74,9 @@ private slots:
     {
         const auto r = Stew("Mix.\r\nBake.");
         QCOMPARE(QByteArray::fromStdString(r->GetMailText()),
-                 "Recipe for Stew" + kPad28 + " Author:Ann\n\n   1/2   cups            flour\n"
-                 "     2                   carrots\n\n\nMix.\r\nBake.");
+                 "Recipe for Stew" + kPad28 +
+                     " Author:Ann\n\n   1/2   cups            flour\n"
+                     "     2                   carrots\n\n\nMix.\r\nBake.");
     }
 
     void page()

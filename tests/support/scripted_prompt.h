@@ -52,11 +52,11 @@ public:
     std::vector<Shown> shown;
     std::vector<std::string> readMeShown;
     std::deque<Answer> answers;
-    std::vector<std::string> opened;          // paths handed to the desktop
-    std::deque<std::string> folderAnswers;     // ChooseFolder; none left: cancelled
-    std::deque<std::string> saveFileAnswers;   // GetSaveFileName; none left: cancelled
-    std::deque<std::string> pdfAnswers;        // ChoosePrinter prints to these PDF files
-    std::vector<std::string> dialogs; // names of the dialogs run, in order
+    std::vector<std::string> opened;         // paths handed to the desktop
+    std::deque<std::string> folderAnswers;   // ChooseFolder; none left: cancelled
+    std::deque<std::string> saveFileAnswers; // GetSaveFileName; none left: cancelled
+    std::deque<std::string> pdfAnswers;      // ChoosePrinter prints to these PDF files
+    std::vector<std::string> dialogs;        // names of the dialogs run, in order
 
     Script<CSelectFolderFields> selectFolder;
     Script<CDocumentFileFields> documentFiles;
