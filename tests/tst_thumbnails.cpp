@@ -267,7 +267,13 @@ void TestThumbnails::pictureCellFromThumbnails()
     CPictureItem item;
     item.SetPathname(WriteJpeg(m_dir->filePath("cell.jpg"), red).toStdString());
     item.SetLabel("cell");
+    item.SetSequenceNumber(12);
+    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("#12 cell"));
+    QCOMPARE(PictureCellCaption(item, false), QStringLiteral("cell"));
+    item.SetSequenceNumber(0);
+    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("cell"));
     item.SetDisplayCaption(0);
+    QCOMPARE(PictureCellCaption(item, true), QString());
     CThumbnailService service(m_root);
     CPictureCellOptions options;
     options.thumbnails = &service;
@@ -304,7 +310,6 @@ void TestThumbnails::pictureCellArea_data()
     QTest::addColumn<int>("caption");
     QTest::addColumn<bool>("fit");
     QTest::addColumn<QRect>("area");
-    const QString label = QStringLiteral("Harbour");
     QTest::newRow("caption, fit") << 15 << true << QRect(7, 10, 119, 65);
     QTest::newRow("caption, natural size") << 15 << false << QRect(0, 0, 133, 80);
     QTest::newRow("no caption, fit") << 0 << true << QRect(7, 5, 119, 90);
@@ -317,16 +322,6 @@ void TestThumbnails::pictureCellArea()
     QFETCH(bool, fit);
     QFETCH(QRect, area);
     QCOMPARE(PictureCellArea(QRect(0, 0, 133, 100), caption, fit), area);
-
-    CPictureItem item;
-    item.SetLabel("Harbour");
-    item.SetSequenceNumber(12);
-    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("#12 Harbour"));
-    QCOMPARE(PictureCellCaption(item, false), QStringLiteral("Harbour"));
-    item.SetSequenceNumber(0);
-    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("Harbour"));
-    item.SetDisplayCaption(0);
-    QCOMPARE(PictureCellCaption(item, true), QString());
 }
 
 QTEST_MAIN(TestThumbnails)
