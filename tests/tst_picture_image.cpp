@@ -14,12 +14,6 @@
 
 namespace {
 
-QString WriteFile(const QString& path, const QByteArray& bytes)
-{
-    QFile file(path);
-    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() ? path : QString();
-}
-
 // The pixel at (x, y) of a one-row picture made of the given colours.
 QImage Row(const QList<QRgb>& pixels)
 {

@@ -156,11 +156,7 @@ void TestThumbnails::validOnlyForTheSameFile()
 
 void TestThumbnails::failureRecord()
 {
-    const QString junk = m_dir->filePath("junk.jpg");
-    QFile file(junk);
-    QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write("not a picture at all");
-    file.close();
+    const QString junk = WriteFile(m_dir->filePath("junk.jpg"), "not a picture at all");
     CThumbnailCache cache(m_root);
     QCOMPARE(MakeThumbnail(junk, 128, &cache).status, CThumbnail::Failed);
     const QString record = cache.FailurePath(CThumbnailCache::FileUri(junk));
@@ -222,13 +218,10 @@ void TestThumbnails::serviceAnswersLater()
     QCOMPARE(known.image.size(), QSize(128, 96));
     QCOMPARE(service.PendingCount(), 0);
 
-    QFile junk(m_dir->filePath("junk.png"));
-    QVERIFY(junk.open(QIODevice::WriteOnly));
-    junk.write("junk");
-    junk.close();
-    QCOMPARE(service.Request(junk.fileName(), 64).status, CThumbnail::Missing);
+    const QString junk = WriteFile(m_dir->filePath("junk.png"), "junk");
+    QCOMPARE(service.Request(junk, 64).status, CThumbnail::Missing);
     QVERIFY(ready.wait(10000));
-    QCOMPARE(service.Request(junk.fileName(), 64).status, CThumbnail::Failed);
+    QCOMPARE(service.Request(junk, 64).status, CThumbnail::Failed);
     QCOMPARE(service.PendingCount(), 0);
 }
 
