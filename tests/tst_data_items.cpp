@@ -62,7 +62,6 @@ void TestDataItems::addEventShowsRow()
     QCOMPARE(f.doc.GetEvents().size(), size_t(1));
     const CEventItem& event = *f.doc.GetEvents().at(0);
     QCOMPARE(event.GetCategoryPath(), std::string("EVENTS\\Birthdays"));
-    QCOMPARE(event.GetFlagB(), 0);
     QCOMPARE(event.GetAttendees().size(), size_t(2));
     const CRowList& rows = f.state.Rows(TabKind::Events);
     QCOMPARE(rows.size(), size_t(1));
