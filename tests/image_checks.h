@@ -3,12 +3,20 @@
 // read back by ImageMagick, a decoder independent of the program's.
 
 #include <QByteArray>
+#include <QFile>
 #include <QImage>
 #include <QProcess>
 #include <QString>
 #include <QStringList>
 
 #include <cstdlib>
+
+// Writes the bytes to path; the path, or an empty string on failure.
+inline QString WriteFile(const QString& path, const QByteArray& bytes)
+{
+    QFile file(path);
+    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() ? path : QString();
+}
 
 // Runs ImageMagick's tool; the standard output, or an empty array on failure.
 inline QByteArray Magick(const QString& tool, const QStringList& arguments)

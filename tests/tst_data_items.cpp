@@ -37,11 +37,9 @@ class TestDataItems : public QObject
 private slots:
     void addEventShowsRow();
     void recipeNeedsDish();
-    void editKeepsEventName();
     void deleteAndMoveNeedSelection_data();
     void deleteAndMoveNeedSelection();
-    void deleteSelected();
-    void moveSelected();
+    void editDeleteMoveSelected();
     void previewPaneAddsPendingItem();
     void newCategory_data();
     void newCategory();
@@ -64,7 +62,6 @@ void TestDataItems::addEventShowsRow()
     QCOMPARE(f.doc.GetEvents().size(), size_t(1));
     const CEventItem& event = *f.doc.GetEvents().at(0);
     QCOMPARE(event.GetCategoryPath(), std::string("EVENTS\\Birthdays"));
-    QCOMPARE(event.GetFlagB(), 0);
     QCOMPARE(event.GetAttendees().size(), size_t(2));
     const CRowList& rows = f.state.Rows(TabKind::Events);
     QCOMPARE(rows.size(), size_t(1));
@@ -103,24 +100,6 @@ void TestDataItems::recipeNeedsDish()
     QCOMPARE(f.doc.GetRecipes().size(), size_t(1));
 }
 
-void TestDataItems::editKeepsEventName()
-{
-    Fixture f;
-    f.AddEvent("Picnic", "park");
-    f.commands.OnCommand(kCmdSelectAll);
-    bool editable = true;
-    f.prompt.editEvent.push_back([&editable](CEventFields& fields) {
-        editable = fields.nameEditable;
-        fields.eventName = "Renamed";
-        fields.keyword1 = "lake";
-        return true;
-    });
-    f.commands.OnCommand(kCmdEdit);
-    QVERIFY(!editable);
-    QCOMPARE(f.doc.GetEvents().at(0)->GetEventName(), std::string("Picnic"));
-    QCOMPARE(f.state.Rows(TabKind::Events).at(0).cells[kItemKeyword], std::string("lake"));
-}
-
 void TestDataItems::deleteAndMoveNeedSelection_data()
 {
     QTest::addColumn<int>("command");
@@ -144,7 +123,7 @@ void TestDataItems::deleteAndMoveNeedSelection()
     QCOMPARE(f.doc.GetEvents().size(), size_t(1));
 }
 
-void TestDataItems::deleteSelected()
+void TestDataItems::editDeleteMoveSelected()
 {
     Fixture f;
     f.AddEvent("Picnic", "park");
@@ -157,13 +136,20 @@ void TestDataItems::deleteSelected()
     QCOMPARE(f.doc.GetEvents().at(0)->GetEventName(), std::string("Wedding"));
     QCOMPARE(rows.size(), size_t(1));
     QCOMPARE(f.doc.GetCurrentItems().eventSequence, 0);
-}
 
-void TestDataItems::moveSelected()
-{
-    Fixture f;
-    f.AddEvent("Picnic", "park");
     f.commands.OnCommand(kCmdSelectAll);
+    bool editable = true;
+    f.prompt.editEvent.push_back([&editable](CEventFields& fields) {
+        editable = fields.nameEditable;
+        fields.eventName = "Renamed";
+        fields.keyword1 = "lake";
+        return true;
+    });
+    f.commands.OnCommand(kCmdEdit);
+    QVERIFY(!editable);
+    QCOMPARE(f.doc.GetEvents().at(0)->GetEventName(), std::string("Wedding"));
+    QCOMPARE(rows.at(0).cells[kItemKeyword], std::string("lake"));
+
     std::vector<std::string> roots;
     f.prompt.chooseCategory.push_back([&roots](CCategoryChooserFields& fields) {
         roots = fields.roots;
@@ -173,8 +159,7 @@ void TestDataItems::moveSelected()
     f.commands.OnCommand(kCmdMove);
     QCOMPARE(roots, std::vector<std::string>{"EVENTS"});
     QCOMPARE(f.doc.GetEvents().at(0)->GetCategoryPath(), std::string("EVENTS\\Holidays"));
-    QCOMPARE(f.state.Rows(TabKind::Events).at(0).cells[kItemCategory],
-             std::string("EVENTS\\Holidays"));
+    QCOMPARE(rows.at(0).cells[kItemCategory], std::string("EVENTS\\Holidays"));
 }
 
 void TestDataItems::previewPaneAddsPendingItem()

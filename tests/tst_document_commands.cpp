@@ -72,44 +72,42 @@ private slots:
 
 void TestDocumentCommands::refusals_data()
 {
-    QTest::addColumn<int>("tab");
+    QTest::addColumn<TabKind>("tab");
     QTest::addColumn<int>("command");
     QTest::addColumn<QString>("text");
     QTest::addColumn<QString>("caption");
-
-    const QString none = QStringLiteral("No item has been selected!");
-    QTest::newRow("load in Documents")
-        << 0 << int(kCmdLoad) << "Unable to load documents from this tab!"
-        << "Load Document(s)";
-    QTest::newRow("delete in Documents")
-        << 0 << int(kCmdDelete) << "Unable to delete documents from this tab!"
-        << "Delete Document(s)";
-    QTest::newRow("edit in Documents")
-        << 0 << int(kCmdEdit) << "Unable to move documents from this tab!"
-        << "Edit Document(s)";
-    QTest::newRow("move in Documents")
-        << 0 << int(kCmdMove) << "Unable to load documents from this tab!"
-        << "Load Document(s)";
-    QTest::newRow("mail in Documents, none selected")
-        << 0 << int(kCmdMail) << none << "Selected Document";
-    QTest::newRow("delete, none selected") << 1 << int(kCmdDelete) << none << "Delete Document(s)";
-    QTest::newRow("edit, none selected") << 1 << int(kCmdEdit) << none << "Edit Document(s)";
-    QTest::newRow("mail, none selected") << 1 << int(kCmdMail) << none << "Selected Document";
-    QTest::newRow("move, none selected") << 1 << int(kCmdMove) << none << "Selected Document";
-    QTest::newRow("add to set, none selected")
-        << 1 << int(kCmdAddToSet) << none << "Selected Document";
+    const auto row = [](const char* name, TabKind tab, int command, const char* text,
+                        const char* caption) {
+        QTest::newRow(name) << tab << command << text << caption;
+    };
+    const TabKind files = TabKind::Documents, managed = TabKind::ManagedDocuments;
+    const char* none = "No item has been selected!";
+    row("load in Documents", files, kCmdLoad, "Unable to load documents from this tab!",
+        "Load Document(s)");
+    row("delete in Documents", files, kCmdDelete, "Unable to delete documents from this tab!",
+        "Delete Document(s)");
+    row("edit in Documents", files, kCmdEdit, "Unable to move documents from this tab!",
+        "Edit Document(s)");
+    row("move in Documents", files, kCmdMove, "Unable to load documents from this tab!",
+        "Load Document(s)");
+    row("mail in Documents, none selected", files, kCmdMail, none, "Selected Document");
+    row("delete, none selected", managed, kCmdDelete, none, "Delete Document(s)");
+    row("edit, none selected", managed, kCmdEdit, none, "Edit Document(s)");
+    row("mail, none selected", managed, kCmdMail, none, "Selected Document");
+    row("move, none selected", managed, kCmdMove, none, "Selected Document");
+    row("add to set, none selected", managed, kCmdAddToSet, none, "Selected Document");
 }
 
 void TestDocumentCommands::refusals()
 {
-    QFETCH(int, tab);
+    QFETCH(TabKind, tab);
     QFETCH(int, command);
     QFETCH(QString, text);
     QFETCH(QString, caption);
 
     Fixture f;
     f.Load({"a.txt"});
-    f.state.SetTab(static_cast<TabKind>(tab));
+    f.state.SetTab(tab);
     QCOMPARE(f.commands.OnCommand(command), 1);
     QCOMPARE(f.prompt.Only().text, text.toStdString());
     QCOMPARE(f.prompt.Only().caption, caption.toStdString());

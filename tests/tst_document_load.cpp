@@ -22,6 +22,14 @@ std::vector<std::string> CategoriesOf(const CItemList& list)
     return categories;
 }
 
+// Loads a folder below the fixture's root as "Select Folder" returns it.
+bool Load(CCommandFixture& f, const std::string& folder, bool unique = false, bool archive = false)
+{
+    CEntryList out;
+    f.ScriptLoad(f.Root() + "/" + folder, unique, archive);
+    return CDocumentLoader(f.env).LoadDocuments(out, false);
+}
+
 // Deletes a file when the load reports its first step.
 class VanishingProgress : public CProgress
 {
@@ -87,10 +95,7 @@ void TestDocumentLoad::picturesCountedWithoutUniqueCheck()
     CCommandFixture f;
     for (const char* name : {"src/a.txt", "src/b.JPG", "src/c.png", "src/d.jpeg"})
         f.MakeFile(name);
-    CDocumentLoader loader(f.env);
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false);
-    loader.LoadDocuments(out, false);
+    Load(f, "src");
     QCOMPARE(f.prompt.Only().text, std::string("Successfully loaded 4 documents."));
     QCOMPARE(f.doc.GetPictures().size(), size_t(2));
     QCOMPARE(f.doc.GetDocuments().size(), size_t(2));
@@ -98,9 +103,9 @@ void TestDocumentLoad::picturesCountedWithoutUniqueCheck()
     CCommandFixture g;
     for (const char* name : {"src/a.txt", "src/b.JPG"})
         g.MakeFile(name);
-    CDocumentLoader picturesOnly(g.env);
+    CEntryList out;
     g.ScriptLoad(g.Root() + "/src", false);
-    picturesOnly.LoadDocuments(out, true);
+    CDocumentLoader(g.env).LoadDocuments(out, true);
     QCOMPARE(g.prompt.Only().text, std::string("Successfully loaded 1 documents."));
     QCOMPARE(g.doc.GetDocuments().size(), size_t(0));
 }
@@ -111,9 +116,7 @@ void TestDocumentLoad::subCategoriesFromFolders()
     f.MakeFile("src/top.txt");
     f.MakeFile("src/2002/May/x.txt");
     f.doc.SetCurrentCategoryPath("DOCUMENTS\\Letters");
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src/", false); // a trailing '/' changes nothing
-    CDocumentLoader(f.env).LoadDocuments(out, false);
+    Load(f, "src/"); // a trailing '/' changes nothing
     const std::vector<std::string> expected = {"DOCUMENTS\\Letters",
                                                "DOCUMENTS\\Letters\\2002\\May"};
     QCOMPARE(CategoriesOf(f.doc.GetDocuments()), expected);
@@ -133,6 +136,7 @@ void TestDocumentLoad::subCategoriesFromFolders()
         fields.createSubCategories = false;
         return true;
     });
+    CEntryList out;
     CDocumentLoader(flat.env).LoadDocuments(out, false);
     QCOMPARE(CategoriesOf(flat.doc.GetDocuments()), std::vector<std::string>{"DOCUMENTS"});
 }
@@ -162,12 +166,8 @@ void TestDocumentLoad::archiveMirrorsSourceTree()
 {
     CCommandFixture f;
     const std::string source = f.MakeFile("src/a.txt", "letter");
-    CDocumentLoader loader(f.env);
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false, true);
-    loader.LoadDocuments(out, false);
-    f.ScriptLoad(f.Root() + "/src", false, true);
-    loader.LoadDocuments(out, false);
+    Load(f, "src", false, true);
+    Load(f, "src", false, true);
     const std::string folder = f.ArchiveRoot() + "/DOCUMENTS" + f.Root() + "/src/";
     const std::string first = folder + "a-" + CCommandFixture::kStamp + ".txt";
     const std::string second = folder + "a-" + CCommandFixture::kStamp + "-2.txt";
@@ -186,9 +186,7 @@ void TestDocumentLoad::lineBreakPathsSkipped()
     CCommandFixture f;
     f.MakeFile("src/ok.txt");
     f.MakeFile("src/bad\nname.txt");
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false);
-    CDocumentLoader(f.env).LoadDocuments(out, false);
+    Load(f, "src");
     QCOMPARE(f.prompt.Only().text,
              "Successfully loaded 1 documents.\nSkipped 1 file(s) whose name holds a line "
              "break:\n" +
@@ -201,6 +199,7 @@ void TestDocumentLoad::lineBreakPathsSkipped()
         fields.files = {f.Root() + "/src/bad\nname.txt"};
         return true;
     });
+    CEntryList out;
     QVERIFY(!CDocumentLoader(f.env).AddDocuments(out));
     QCOMPARE(prompt.Only().text, "Skipped 1 file(s) whose name holds a line break:\n" + f.Root() +
                                      "/src/bad\\nname.txt");
@@ -215,12 +214,8 @@ void TestDocumentLoad::symbolicLinkLoop()
     f.MakeFile("src/sub/b.txt");
     QVERIFY(::symlink((f.Root() + "/src").c_str(), (f.Root() + "/src/sub/loop").c_str()) == 0);
     QVERIFY(::symlink((f.Root() + "/self").c_str(), (f.Root() + "/self").c_str()) == 0);
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false);
-    f.ScriptLoad(f.Root() + "/self", false);
-    CDocumentLoader loader(f.env);
-    loader.LoadDocuments(out, false);
-    loader.LoadDocuments(out, false);
+    Load(f, "src");
+    Load(f, "self");
     QCOMPARE(f.prompt.shown.at(0).text, std::string("Successfully loaded 2 documents."));
     QCOMPARE(f.prompt.shown.at(1).text, std::string("Successfully loaded 0 documents."));
 }
@@ -233,9 +228,7 @@ void TestDocumentLoad::fileVanishingDuringLoad()
     const std::string gone = f.MakeFile("src/c.txt");
     VanishingProgress progress(gone);
     f.env.SetProgress(&progress);
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false, true);
-    CDocumentLoader(f.env).LoadDocuments(out, false);
+    Load(f, "src", false, true);
     QCOMPARE(f.prompt.shown.back().text, std::string("Successfully loaded 2 documents."));
     for (const auto& item : f.doc.GetDocuments())
         QVERIFY(item->GetOriginalPathname() != gone);
@@ -250,9 +243,7 @@ void TestDocumentLoad::unreadableSubFolder()
     const std::string locked = f.MakeFolder("src/locked");
     f.MakeFile("src/locked/b.txt");
     QFile::setPermissions(QString::fromStdString(locked), QFileDevice::Permissions());
-    CEntryList out;
-    f.ScriptLoad(f.Root() + "/src", false);
-    CDocumentLoader(f.env).LoadDocuments(out, false);
+    Load(f, "src");
     QFile::setPermissions(QString::fromStdString(locked),
                           QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
     QCOMPARE(f.prompt.Only().text, std::string("Successfully loaded 1 documents."));
@@ -279,39 +270,21 @@ void TestDocumentLoad::duplicateRule_data()
     QTest::addColumn<QString>("differs");  // what the new entry changes
     QTest::addColumn<bool>("duplicate");
 
-    QTest::newRow("same document") << "a.txt"
-                                   << "ns"
-                                   << "" << true;
-    QTest::newRow("document in another category") << "a.txt"
-                                                  << "ns"
-                                                  << "category" << false;
-    QTest::newRow("document, other modify date") << "a.txt"
-                                                 << "ns"
-                                                 << "modify" << false;
-    QTest::newRow("document, other create date") << "a.txt"
-                                                 << ""
-                                                 << "create" << false;
-    QTest::newRow("picture, name and size, other create date") << "a.jpg"
-                                                               << "ns"
-                                                               << "create" << true;
-    QTest::newRow("picture, name and size, other size") << "a.jpg"
-                                                        << "ns"
-                                                        << "size" << false;
-    QTest::newRow("picture, modify only, other create date") << "a.jpg"
-                                                             << "m"
-                                                             << "create" << true;
-    QTest::newRow("picture, create only, other modify date") << "a.jpg"
-                                                             << "c"
-                                                             << "modify" << true;
-    QTest::newRow("picture, create only, other create date") << "a.jpg"
-                                                             << "c"
-                                                             << "create" << false;
-    QTest::newRow("picture in another category") << "a.jpg"
-                                                 << ""
-                                                 << "category" << false;
-    QTest::newRow("picture, name, other file") << "a.JPG"
-                                               << "n"
-                                               << "name" << false;
+    const auto row = [](const char* name, const char* file, const char* criteria,
+                        const char* differs, bool duplicate) {
+        QTest::newRow(name) << file << criteria << differs << duplicate;
+    };
+    row("same document", "a.txt", "ns", "", true);
+    row("document in another category", "a.txt", "ns", "category", false);
+    row("document, other modify date", "a.txt", "ns", "modify", false);
+    row("document, other create date", "a.txt", "", "create", false);
+    row("picture, name and size, other create date", "a.jpg", "ns", "create", true);
+    row("picture, name and size, other size", "a.jpg", "ns", "size", false);
+    row("picture, modify only, other create date", "a.jpg", "m", "create", true);
+    row("picture, create only, other modify date", "a.jpg", "c", "modify", true);
+    row("picture, create only, other create date", "a.jpg", "c", "create", false);
+    row("picture in another category", "a.jpg", "", "category", false);
+    row("picture, name, other file", "a.JPG", "n", "name", false);
 }
 
 void TestDocumentLoad::duplicateRule()

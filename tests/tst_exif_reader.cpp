@@ -66,8 +66,9 @@ void Expect(const CExifInfo& info, const QString& expected)
     }
 }
 
-using Directories = QList<QList<Field>>;
-using MakeDirectories = std::function<Directories(const TiffBuilder&)>;
+using Dirs = QList<QList<Field>>;
+using TB = const TiffBuilder&;
+using MakeDirectories = std::function<Dirs(TB)>;
 
 } // namespace
 
@@ -92,116 +93,84 @@ void TestExifReader::tags_data()
 {
     QTest::addColumn<QByteArray>("block");
     QTest::addColumn<QString>("expected");
-    // Every case in both byte orders, which must read the same.
-    auto row = [](const char* name, MakeDirectories make, const QString& expected,
-                  std::optional<quint32> firstOffset = std::nullopt, int cut = 0) {
+    // Every case in both byte orders, which must read the same. cut > 0 keeps
+    // only the block's first bytes; first replaces the first directory's offset.
+    const auto cutRow = [](const char* name, const QString& expected, int cut,
+                           std::optional<quint32> first, const MakeDirectories& make) {
         for (bool be : {false, true}) {
             TiffBuilder t(be);
             for (const QList<Field>& directory : make(t))
                 t.AddDirectory(directory);
-            const QByteArray block = t.Build(firstOffset);
+            const QByteArray block = t.Build(first);
             QTest::addRow("%s %s", be ? "MM" : "II", name)
                 << (cut ? block.left(cut) : block) << expected;
         }
     };
-    row(
-        "camera: main, EXIF and interoperability directories",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Ascii(0x010F, "Canon"), t.Ascii(0x0110, "Canon EOS 40D"), t.Short(0x0112, 6),
-                     t.Rational(0x011A, 72, 1), t.Rational(0x011B, 300, 1), t.Short(0x0128, 3),
-                     t.Ascii(0x0131, "GIMP 2.4.5"), t.Ascii(0x013B, "Ann"),
-                     t.Ascii(0x8298, "(c) Ann"), t.Pointer(0x8769, 1)},
-                    {t.Rational(0x829A, 1, 160),
-                     t.Rational(0x829D, 71, 10),
-                     t.Short(0x8822, 1),
-                     t.Short(0x8827, 400),
-                     t.Undefined(0x9000, "0221"),
-                     t.Ascii(0x9003, "2008:05:30 15:56:01"),
-                     t.Rational(0x9102, 3, 1),
-                     t.SRational(0x9201, 7, 1),
-                     t.SRational(0x9203, -1, 2),
-                     t.SRational(0x9204, -2, 3),
-                     t.Rational(0x9206, 27, 10),
-                     t.Short(0x9207, 5),
-                     t.Short(0x9209, 9),
-                     t.Rational(0x920A, 135, 1),
-                     t.Undefined(0x9286, QByteArray("ASCII\0\0\0Hello there", 19)),
-                     t.Long(0xA002, 3888),
-                     t.Long(0xA003, 2592),
-                     t.Pointer(0xA005, 2),
-                     t.Rational(0xA20E, 4438, 1),
-                     t.Rational(0xA20F, 4445, 1),
-                     t.Short(0xA210, 2)},
-                    {t.Ascii(0x0001, "R98")}};
-        },
+    const auto row = [&](const char* name, const QString& expected, const MakeDirectories& make) {
+        cutRow(name, expected, 0, std::nullopt, make);
+    };
+    // clang-format off
+    row("camera: main, EXIF and interoperability directories",
         "make=Canon|model=Canon EOS 40D|orientation=6|resolution=72/300/3|software=GIMP 2.4.5|"
         "artist=Ann|copyright=(c) Ann|time=0.00625|fnumber=7.1|program=1|iso=400|version=0221|"
         "date=2008:05:30 15:56:01|compression=3|shutter=7|brightness=-0.5|bias=-0.6666667|"
         "distance=2.7|metering=5|flash=1|focal=135|comments=Hello there|size=3888x2592|"
-        "plane=4438/4445/2|read=1");
+        "plane=4438/4445/2|read=1",
+        [](TB t) -> Dirs {
+            return {{t.Ascii(0x010F, "Canon"), t.Ascii(0x0110, "Canon EOS 40D"), t.Short(0x0112, 6),
+                     t.Rational(0x011A, 72, 1), t.Rational(0x011B, 300, 1), t.Short(0x0128, 3),
+                     t.Ascii(0x0131, "GIMP 2.4.5"), t.Ascii(0x013B, "Ann"),
+                     t.Ascii(0x8298, "(c) Ann"), t.Pointer(0x8769, 1)},
+                    {t.Rational(0x829A, 1, 160), t.Rational(0x829D, 71, 10), t.Short(0x8822, 1),
+                     t.Short(0x8827, 400), t.Undefined(0x9000, "0221"),
+                     t.Ascii(0x9003, "2008:05:30 15:56:01"), t.Rational(0x9102, 3, 1),
+                     t.SRational(0x9201, 7, 1), t.SRational(0x9203, -1, 2),
+                     t.SRational(0x9204, -2, 3), t.Rational(0x9206, 27, 10), t.Short(0x9207, 5),
+                     t.Short(0x9209, 9), t.Rational(0x920A, 135, 1),
+                     t.Undefined(0x9286, QByteArray("ASCII\0\0\0Hello there", 19)),
+                     t.Long(0xA002, 3888), t.Long(0xA003, 2592), t.Pointer(0xA005, 2),
+                     t.Rational(0xA20E, 4438, 1), t.Rational(0xA20F, 4445, 1), t.Short(0xA210, 2)},
+                    {t.Ascii(0x0001, "R98")}};
+        });
+    // clang-format on
 
     for (int flash : {0x00, 0x10, 0x20, 0x01, 0x05, 0x07, 0x18}) {
-        const QString name = QStringLiteral("flash 0x%1").arg(flash, 2, 16, QLatin1Char('0'));
-        row(
-            qPrintable(name),
-            [flash](const TiffBuilder& t) -> Directories { return {{t.Short(0x9209, flash)}}; },
-            QStringLiteral("flash=%1").arg((flash & 0x0F) ? 1 : 0));
+        row(qPrintable(QStringLiteral("flash 0x%1").arg(flash, 2, 16, QLatin1Char('0'))),
+            QStringLiteral("flash=%1").arg((flash & 0x0F) ? 1 : 0),
+            [flash](TB t) -> Dirs { return {{t.Short(0x9209, flash)}}; });
     }
-    row(
-        "aperture value stands in for the F-number",
-        [](const TiffBuilder& t) -> Directories { return {{t.Rational(0x9202, 4, 1)}}; },
-        "fnumber=4");
-    row(
-        "max aperture value too",
-        [](const TiffBuilder& t) -> Directories { return {{t.Rational(0x9205, 3, 1)}}; },
-        "fnumber=3");
-    row(
-        "an F-number read first wins",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Rational(0x829D, 28, 10), t.Rational(0x9202, 4, 1)}};
-        },
-        "fnumber=2.8");
-    row(
-        "the F-number replaces an aperture value",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Rational(0x9202, 4, 1), t.Rational(0x829D, 28, 10)}};
-        },
-        "fnumber=2.8");
+    row("aperture value stands in for the F-number", "fnumber=4",
+        [](TB t) -> Dirs { return {{t.Rational(0x9202, 4, 1)}}; });
+    row("max aperture value too", "fnumber=3",
+        [](TB t) -> Dirs { return {{t.Rational(0x9205, 3, 1)}}; });
+    row("an F-number read first wins", "fnumber=2.8", [](TB t) -> Dirs {
+        return {{t.Rational(0x829D, 28, 10), t.Rational(0x9202, 4, 1)}};
+    });
+    row("the F-number replaces an aperture value", "fnumber=2.8", [](TB t) -> Dirs {
+        return {{t.Rational(0x9202, 4, 1), t.Rational(0x829D, 28, 10)}};
+    });
 
     // Count x size decides where a value sits; a text also ends with its own bytes.
-    row(
-        "texts in the entry and at an offset",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Ascii(0x010F, "Abc"), t.Ascii(0x0110, "Model Five")}};
-        },
-        "make=Abc|model=Model Five");
-    row(
-        "unterminated text in the entry",
-        [](const TiffBuilder& t) -> Directories {
-            return {{Field{0x010F, 2, 4, "Leic"}, t.Ascii(0x0110, "M")}};
-        },
-        "make=Leic|model=M");
-    row(
-        "three shorts sit at an offset",
-        [](const TiffBuilder&) -> Directories {
-            return {{Field{0x010F, 3, 3, QByteArray("Sony\0\0", 6)}}};
-        },
-        "make=Sony");
-    row(
-        "make cut at 31, model at 39",
-        [](const TiffBuilder& t) -> Directories {
+    row("texts in the entry and at an offset", "make=Abc|model=Model Five", [](TB t) -> Dirs {
+        return {{t.Ascii(0x010F, "Abc"), t.Ascii(0x0110, "Model Five")}};
+    });
+    row("unterminated text in the entry", "make=Leic|model=M", [](TB t) -> Dirs {
+        return {{Field{0x010F, 2, 4, "Leic"}, t.Ascii(0x0110, "M")}};
+    });
+    row("three shorts sit at an offset", "make=Sony", [](TB) -> Dirs {
+        return {{Field{0x010F, 3, 3, QByteArray("Sony\0\0", 6)}}};
+    });
+    row("make cut at 31, model at 39", "make=" + QString(31, 'a') + "|model=" + QString(39, 'b'),
+        [](TB t) -> Dirs {
             return {{t.Ascii(0x010F, QByteArray(40, 'a')), t.Ascii(0x0110, QByteArray(45, 'b'))}};
-        },
-        "make=" + QString(31, 'a') + "|model=" + QString(39, 'b'));
-    row(
-        "first software, artist and copyright kept",
-        [](const TiffBuilder& t) -> Directories {
+        });
+    row("first software, artist and copyright kept",
+        "software=Soft 1|artist=Art 1|copyright=Right 1|make=Make 2", [](TB t) -> Dirs {
             return {{t.Ascii(0x0131, "Soft 1"), t.Ascii(0x013B, "Art 1"),
                      t.Ascii(0x8298, "Right 1"), t.Pointer(0x8769, 1)},
                     {t.Ascii(0x0131, "Soft 2"), t.Ascii(0x013B, "Art 2"),
                      t.Ascii(0x8298, "Right 2"), t.Ascii(0x010F, "Make 2")}};
-        },
-        "software=Soft 1|artist=Art 1|copyright=Right 1|make=Make 2");
+        });
 
     const QList<QPair<QByteArray, QString>> comments = {
         {QByteArray("ASCII\0\0\0Holiday at sea", 22), "Holiday at sea"},
@@ -209,79 +178,47 @@ void TestExifReader::tags_data()
         {QByteArray("\0\0\0\0\0\0\0\0text", 12), ""},
         {QByteArray("ASCII\0\0\0", 8) + QByteArray(120, 'x'), QString(92, 'x')}};
     for (const auto& comment : comments) {
-        row(
-            qPrintable("comment " + comment.second.left(10)),
-            [comment](const TiffBuilder& t) -> Directories {
-                return {{t.Undefined(0x9286, comment.first)}};
-            },
-            "comments=" + comment.second);
+        row(qPrintable("comment " + comment.second.left(10)), "comments=" + comment.second,
+            [comment](TB t) -> Dirs { return {{t.Undefined(0x9286, comment.first)}}; });
     }
 
     // Bounds: every directory is walked once, and only inside the data.
-    row(
-        "directory pointing at itself",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Pointer(0x8769, 0), t.Short(0x8827, 100)}};
-        },
-        "iso=100|read=1");
-    row(
-        "two directories pointing at each other",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Pointer(0x8769, 1), t.Ascii(0x010F, "Nikon")},
-                    {t.Pointer(0xA005, 0), t.Short(0x8827, 200)}};
-        },
-        "iso=200|make=Nikon|read=1");
-    row(
-        "negative pointer skips only its directory",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Slot(0x8769, 4, 1, 4), t.Short(0x8827, 50)}};
-        },
-        "iso=50|read=1");
-    row(
-        "pointer past the end is an empty directory",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Slot(0x8769, 4, 1, 100000), t.Short(0x8827, 64)}};
-        },
-        "iso=64|read=1");
-    row(
-        "first directory before the data",
-        [](const TiffBuilder& t) -> Directories { return {{t.Short(0x8827, 80)}}; }, "iso=0|read=0",
-        2);
-    row(
-        "type above 12 abandons the directory",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Ascii(0x010F, "Kept"), Field{0x8827, 13, 1, "\x10\0"}, t.Short(0x8827, 9)}};
-        },
-        "make=Kept|iso=0|read=0");
-    row(
-        "an abandoned sub-directory leaves its parent going",
-        [](const TiffBuilder& t) -> Directories {
+    row("directory pointing at itself", "iso=100|read=1", [](TB t) -> Dirs {
+        return {{t.Pointer(0x8769, 0), t.Short(0x8827, 100)}};
+    });
+    row("two directories pointing at each other", "iso=200|make=Nikon|read=1", [](TB t) -> Dirs {
+        return {{t.Pointer(0x8769, 1), t.Ascii(0x010F, "Nikon")},
+                {t.Pointer(0xA005, 0), t.Short(0x8827, 200)}};
+    });
+    row("negative pointer skips only its directory", "iso=50|read=1", [](TB t) -> Dirs {
+        return {{t.Slot(0x8769, 4, 1, 4), t.Short(0x8827, 50)}};
+    });
+    row("pointer past the end is an empty directory", "iso=64|read=1", [](TB t) -> Dirs {
+        return {{t.Slot(0x8769, 4, 1, 100000), t.Short(0x8827, 64)}};
+    });
+    cutRow("first directory before the data", "iso=0|read=0", 0, 2,
+           [](TB t) -> Dirs { return {{t.Short(0x8827, 80)}}; });
+    row("type above 12 abandons the directory", "make=Kept|iso=0|read=0", [](TB t) -> Dirs {
+        return {{t.Ascii(0x010F, "Kept"), Field{0x8827, 13, 1, "\x10\0"}, t.Short(0x8827, 9)}};
+    });
+    row("an abandoned sub-directory leaves its parent going", "make=After|read=1",
+        [](TB t) -> Dirs {
             return {{t.Pointer(0x8769, 1), t.Ascii(0x010F, "After")}, {Field{1, 200, 1, "\0\0"}}};
-        },
-        "make=After|read=1");
-    row(
-        "value past the end abandons the directory",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Slot(0x010F, 2, 20, 5000), t.Short(0x8827, 12)}};
-        },
-        "iso=0|read=0");
-    row(
-        "entry cut by the end of the data",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Short(0x8827, 320), t.Ascii(0x010F, "Lost")}};
-        },
-        "iso=320|make=|read=1", std::nullopt, 8 + 2 + 12 + 6);
-    row(
-        "rational cut by the end of the data",
-        [](const TiffBuilder& t) -> Directories {
-            return {{t.Short(0x8827, 25), t.Slot(0x829A, 5, 1, 8 + 2 + 36 + 4),
-                     t.Ascii(0x010F, "Unread")}};
-        },
-        "iso=25|time=0|make=|read=1", std::nullopt, 8 + 2 + 36 + 4 + 4);
-    row(
-        "header cut short",
-        [](const TiffBuilder& t) -> Directories { return {{t.Short(0x8827, 7)}}; }, "iso=0|read=0",
-        std::nullopt, 6);
+        });
+    row("value past the end abandons the directory", "iso=0|read=0", [](TB t) -> Dirs {
+        return {{t.Slot(0x010F, 2, 20, 5000), t.Short(0x8827, 12)}};
+    });
+    cutRow("entry cut by the end of the data", "iso=320|make=|read=1", 8 + 2 + 12 + 6, std::nullopt,
+           [](TB t) -> Dirs {
+               return {{t.Short(0x8827, 320), t.Ascii(0x010F, "Lost")}};
+           });
+    cutRow("rational cut by the end of the data", "iso=25|time=0|make=|read=1", 8 + 2 + 36 + 4 + 4,
+           std::nullopt, [](TB t) -> Dirs {
+               return {{t.Short(0x8827, 25), t.Slot(0x829A, 5, 1, 8 + 2 + 36 + 4),
+                        t.Ascii(0x010F, "Unread")}};
+           });
+    cutRow("header cut short", "iso=0|read=0", 6, std::nullopt,
+           [](TB t) -> Dirs { return {{t.Short(0x8827, 7)}}; });
 }
 
 void TestExifReader::tags()

@@ -90,8 +90,7 @@ class TestFolderTree : public QObject
 private slots:
     void classify_data();
     void classify();
-    void volumeOfPath();
-    void treeVolumes();
+    void volumes();
     void driveItems();
     void expandAndCollapse();
     void selectFolderArchiveMode_data();
@@ -104,29 +103,22 @@ void TestFolderTree::classify_data()
     QTest::addColumn<QString>("fileSystem");
     QTest::addColumn<QString>("mountPoint");
     QTest::addColumn<bool>("removableDevice");
-    QTest::addColumn<int>("type");
-    QTest::newRow("disk") << "ext4"
-                          << "/" << false << int(DriveType::Fixed);
-    QTest::newRow("usb stick flag") << "vfat"
-                                    << "/mnt/stick" << true << int(DriveType::Removable);
-    QTest::newRow("under /media") << "vfat"
-                                  << "/media/ann/CAMERA" << false << int(DriveType::Removable);
-    QTest::newRow("under /run/media") << "exfat"
-                                      << "/run/media/ann/X" << false << int(DriveType::Removable);
-    QTest::newRow("not /mediaserver") << "ext4"
-                                      << "/mediaserver" << false << int(DriveType::Fixed);
-    QTest::newRow("dvd") << "iso9660"
-                         << "/media/cdrom" << true << int(DriveType::CdRom);
-    QTest::newRow("blu-ray") << "udf"
-                             << "/media/bd" << false << int(DriveType::CdRom);
-    QTest::newRow("nfs") << "nfs4"
-                         << "/net/home" << false << int(DriveType::Remote);
-    QTest::newRow("samba") << "cifs"
-                           << "/mnt/share" << false << int(DriveType::Remote);
-    QTest::newRow("sshfs") << "fuse.sshfs"
-                           << "/home/ann/remote" << false << int(DriveType::Remote);
-    QTest::newRow("tmpfs") << "tmpfs"
-                           << "/tmp" << false << int(DriveType::RamDisk);
+    QTest::addColumn<DriveType>("type");
+    const auto row = [](const char* name, const char* fs, const char* mount, bool removable,
+                        DriveType type) {
+        QTest::newRow(name) << fs << mount << removable << type;
+    };
+    row("disk", "ext4", "/", false, DriveType::Fixed);
+    row("usb stick flag", "vfat", "/mnt/stick", true, DriveType::Removable);
+    row("under /media", "vfat", "/media/ann/CAMERA", false, DriveType::Removable);
+    row("under /run/media", "exfat", "/run/media/ann/X", false, DriveType::Removable);
+    row("not /mediaserver", "ext4", "/mediaserver", false, DriveType::Fixed);
+    row("dvd", "iso9660", "/media/cdrom", true, DriveType::CdRom);
+    row("blu-ray", "udf", "/media/bd", false, DriveType::CdRom);
+    row("nfs", "nfs4", "/net/home", false, DriveType::Remote);
+    row("samba", "cifs", "/mnt/share", false, DriveType::Remote);
+    row("sshfs", "fuse.sshfs", "/home/ann/remote", false, DriveType::Remote);
+    row("tmpfs", "tmpfs", "/tmp", false, DriveType::RamDisk);
 }
 
 void TestFolderTree::classify()
@@ -134,30 +126,24 @@ void TestFolderTree::classify()
     QFETCH(QString, fileSystem);
     QFETCH(QString, mountPoint);
     QFETCH(bool, removableDevice);
-    QFETCH(int, type);
-    QCOMPARE(
-        int(ClassifyVolume(fileSystem.toStdString(), mountPoint.toStdString(), removableDevice)),
-        type);
+    QFETCH(DriveType, type);
+    QCOMPARE(ClassifyVolume(fileSystem.toStdString(), mountPoint.toStdString(), removableDevice),
+             type);
 }
 
-void TestFolderTree::volumeOfPath()
+void TestFolderTree::volumes()
 {
     const std::vector<CVolume> mounted = {Volume("/", DriveType::Fixed),
-                                          Volume("/media/ann/CAM", DriveType::Removable),
+                                          Volume("/run/user/0", DriveType::RamDisk),
+                                          Volume("/media/ann/CAM", DriveType::Removable, "CAM"),
                                           Volume("/media/ann/CAM/DCIM", DriveType::Remote)};
     QCOMPARE(VolumeTypeOf("/media/ann/CAM/x", mounted), DriveType::Removable);
     QCOMPARE(VolumeTypeOf("/media/ann/CAM/DCIM/1", mounted), DriveType::Remote);
     QCOMPARE(VolumeTypeOf("/media/ann/CAMERA", mounted), DriveType::Fixed);
     QCOMPARE(VolumeTypeOf("relative", {}), DriveType::Fixed);
-}
-
-void TestFolderTree::treeVolumes()
-{
-    const std::vector<CVolume> mounted = {Volume("/", DriveType::Fixed),
-                                          Volume("/run/user/0", DriveType::RamDisk),
-                                          Volume("/media/ann/CAM", DriveType::Removable, "CAM")};
+    // The tree's top: the root, the home folder, then the volumes but RAM disks.
     const std::vector<CVolume> top = TreeVolumes(mounted, "/home/ann");
-    QCOMPARE(top.size(), size_t(3));
+    QCOMPARE(top.size(), size_t(4));
     QCOMPARE(top[0].ItemText(), std::string("/"));
     QCOMPARE(top[1].ItemText(), std::string("/home/ann"));
     QCOMPARE(top[2].ItemText(), std::string("CAM /media/ann/CAM"));

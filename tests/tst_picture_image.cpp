@@ -14,12 +14,6 @@
 
 namespace {
 
-QString WriteFile(const QString& path, const QByteArray& bytes)
-{
-    QFile file(path);
-    return file.open(QIODevice::WriteOnly) && file.write(bytes) == bytes.size() ? path : QString();
-}
-
 // The pixel at (x, y) of a one-row picture made of the given colours.
 QImage Row(const QList<QRgb>& pixels)
 {
@@ -335,31 +329,22 @@ void TestPictureImage::saveByExtension_data()
     QTest::addColumn<QString>("name");
     QTest::addColumn<QString>("format"); // empty: nothing may be written
     QTest::addColumn<double>("tolerance");
+    const auto row = [](const char* name, const char* file, const char* format, double tolerance) {
+        QTest::newRow(name) << file << format << tolerance;
+    };
     // Sharp colour edges cost JPEG a few levels (its colour is halved).
-    QTest::newRow("jpg") << "out.jpg"
-                         << "JPEG" << 6.0;
-    QTest::newRow("JPG upper case") << "OUT2.JPG"
-                                    << "JPEG" << 6.0;
-    QTest::newRow("jpeg") << "out.jpeg"
-                          << "JPEG" << 6.0;
-    QTest::newRow("png") << "out.png"
-                         << "PNG" << 0.0;
-    QTest::newRow("Png mixed case") << "out2.Png"
-                                    << "PNG" << 0.0;
-    QTest::newRow("bmp") << "out.bmp"
-                         << "BMP" << 0.0;
-    QTest::newRow("gif") << "out.gif"
-                         << "GIF" << 0.0;
-    QTest::newRow("unknown extension") << "out.xyz"
-                                       << "" << 0.0;
-    QTest::newRow("no extension") << "out"
-                                  << "" << 0.0;
-    QTest::newRow("trailing dot") << "out."
-                                  << "" << 0.0;
-    QTest::newRow("wmf has no encoder") << "out.wmf"
-                                        << "" << 0.0;
-    QTest::newRow("dot in the folder only") << "a.b/out"
-                                            << "" << 0.0;
+    row("jpg", "out.jpg", "JPEG", 6.0);
+    row("JPG upper case", "OUT2.JPG", "JPEG", 6.0);
+    row("jpeg", "out.jpeg", "JPEG", 6.0);
+    row("png", "out.png", "PNG", 0.0);
+    row("Png mixed case", "out2.Png", "PNG", 0.0);
+    row("bmp", "out.bmp", "BMP", 0.0);
+    row("gif", "out.gif", "GIF", 0.0);
+    row("unknown extension", "out.xyz", "", 0.0);
+    row("no extension", "out", "", 0.0);
+    row("trailing dot", "out.", "", 0.0);
+    row("wmf has no encoder", "out.wmf", "", 0.0);
+    row("dot in the folder only", "a.b/out", "", 0.0);
 }
 
 void TestPictureImage::saveByExtension()

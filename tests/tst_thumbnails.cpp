@@ -156,11 +156,7 @@ void TestThumbnails::validOnlyForTheSameFile()
 
 void TestThumbnails::failureRecord()
 {
-    const QString junk = m_dir->filePath("junk.jpg");
-    QFile file(junk);
-    QVERIFY(file.open(QIODevice::WriteOnly));
-    file.write("not a picture at all");
-    file.close();
+    const QString junk = WriteFile(m_dir->filePath("junk.jpg"), "not a picture at all");
     CThumbnailCache cache(m_root);
     QCOMPARE(MakeThumbnail(junk, 128, &cache).status, CThumbnail::Failed);
     const QString record = cache.FailurePath(CThumbnailCache::FileUri(junk));
@@ -222,13 +218,10 @@ void TestThumbnails::serviceAnswersLater()
     QCOMPARE(known.image.size(), QSize(128, 96));
     QCOMPARE(service.PendingCount(), 0);
 
-    QFile junk(m_dir->filePath("junk.png"));
-    QVERIFY(junk.open(QIODevice::WriteOnly));
-    junk.write("junk");
-    junk.close();
-    QCOMPARE(service.Request(junk.fileName(), 64).status, CThumbnail::Missing);
+    const QString junk = WriteFile(m_dir->filePath("junk.png"), "junk");
+    QCOMPARE(service.Request(junk, 64).status, CThumbnail::Missing);
     QVERIFY(ready.wait(10000));
-    QCOMPARE(service.Request(junk.fileName(), 64).status, CThumbnail::Failed);
+    QCOMPARE(service.Request(junk, 64).status, CThumbnail::Failed);
     QCOMPARE(service.PendingCount(), 0);
 }
 
@@ -267,7 +260,13 @@ void TestThumbnails::pictureCellFromThumbnails()
     CPictureItem item;
     item.SetPathname(WriteJpeg(m_dir->filePath("cell.jpg"), red).toStdString());
     item.SetLabel("cell");
+    item.SetSequenceNumber(12);
+    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("#12 cell"));
+    QCOMPARE(PictureCellCaption(item, false), QStringLiteral("cell"));
+    item.SetSequenceNumber(0);
+    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("cell"));
     item.SetDisplayCaption(0);
+    QCOMPARE(PictureCellCaption(item, true), QString());
     CThumbnailService service(m_root);
     CPictureCellOptions options;
     options.thumbnails = &service;
@@ -304,7 +303,6 @@ void TestThumbnails::pictureCellArea_data()
     QTest::addColumn<int>("caption");
     QTest::addColumn<bool>("fit");
     QTest::addColumn<QRect>("area");
-    const QString label = QStringLiteral("Harbour");
     QTest::newRow("caption, fit") << 15 << true << QRect(7, 10, 119, 65);
     QTest::newRow("caption, natural size") << 15 << false << QRect(0, 0, 133, 80);
     QTest::newRow("no caption, fit") << 0 << true << QRect(7, 5, 119, 90);
@@ -317,16 +315,6 @@ void TestThumbnails::pictureCellArea()
     QFETCH(bool, fit);
     QFETCH(QRect, area);
     QCOMPARE(PictureCellArea(QRect(0, 0, 133, 100), caption, fit), area);
-
-    CPictureItem item;
-    item.SetLabel("Harbour");
-    item.SetSequenceNumber(12);
-    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("#12 Harbour"));
-    QCOMPARE(PictureCellCaption(item, false), QStringLiteral("Harbour"));
-    item.SetSequenceNumber(0);
-    QCOMPARE(PictureCellCaption(item, true), QStringLiteral("Harbour"));
-    item.SetDisplayCaption(0);
-    QCOMPARE(PictureCellCaption(item, true), QString());
 }
 
 QTEST_MAIN(TestThumbnails)
