@@ -111,19 +111,6 @@ private slots:
                  folder);
     }
 
-    void fileErrorTexts()
-    {
-        QCOMPARE(CAppFolders::FileErrorText(0), std::string("No Error Occurred"));
-        QCOMPARE(CAppFolders::FileErrorText(14), std::string("End of File"));
-        QCOMPARE(CAppFolders::FileErrorText(15), std::string("Unknown Error"));
-        QCOMPARE(CAppFolders::FileErrorText(CAppFolders::FileErrorCode(ENOENT)),
-                 std::string("The file could not be located"));
-        QCOMPARE(CAppFolders::FileErrorText(CAppFolders::FileErrorCode(ENOSPC)),
-                 std::string("Disk Full"));
-        QCOMPARE(CAppFolders::FileErrorText(CAppFolders::FileErrorCode(EACCES)),
-                 std::string("The file could not be accessed"));
-    }
-
     void installFolderRule()
     {
         QTemporaryDir dir;
