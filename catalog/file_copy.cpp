@@ -91,25 +91,23 @@ int CopyFileTo(const std::string& source, const std::string& target, const CCopy
         return errno;
     int error = 0;
     if (options.head) {
+        // Read without moving the offset: the copy itself stays in the kernel.
         options.head->resize(options.headBytes);
         size_t got = 0;
         while (got < options.headBytes) {
-            const ssize_t n = ::read(in.get(), options.head->data() + got, options.headBytes - got);
+            const ssize_t n = ::pread(in.get(), options.head->data() + got,
+                                      options.headBytes - got, static_cast<off_t>(got));
             if (n < 0 && errno == EINTR)
                 continue;
-            if (n < 0)
-                error = errno;
             if (n <= 0)
                 break;
             got += static_cast<size_t>(n);
         }
         options.head->resize(got);
-        if (!error)
-            error = WriteAll(out.get(), options.head->data(), got);
     }
     if (!error)
         error = CopyRest(in.get(), out.get());
-    if (!error) {
+    if (!error && options.keepFileTimes) {
         const struct timespec times[2] = {st.st_atim, st.st_mtim};
         ::futimens(out.get(), times);
     }

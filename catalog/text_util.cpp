@@ -2,6 +2,7 @@
 
 #include <cstdarg>
 #include <cstdio>
+#include <cstring>
 
 std::string StrFormat(const char* format, ...)
 {
@@ -33,7 +34,9 @@ std::string OneLine(std::string_view text)
 
 bool HasLineBreak(std::string_view text)
 {
-    return text.find_first_of("\r\n") != std::string_view::npos;
+    // Two scans with memchr beat find_first_of, which tests one byte at a time.
+    return std::memchr(text.data(), '\n', text.size()) != nullptr ||
+           std::memchr(text.data(), '\r', text.size()) != nullptr;
 }
 
 std::vector<std::string> SplitCrLfLines(std::string_view text)

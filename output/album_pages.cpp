@@ -162,8 +162,9 @@ bool CPhotoAlbum::CreateWebPages(CWebSite& site, const std::string& folder, int*
             std::string head;
             CCopyOptions copy;
             copy.overwrite = true;
+            copy.keepFileTimes = false; // a page's picture is a new file
             copy.head = &head;
-            copy.headBytes = 128 * 1024; // past a full-size EXIF block to the frame header
+            copy.headBytes = 16 * 1024; // the frame header of most pictures
             if (CopyFileTo(source, copyPath, copy) != 0 && failedCopies)
                 ++*failedCopies;
             m_generatedFiles.Append(GeneratedFile(copyPath));
