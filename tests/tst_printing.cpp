@@ -102,6 +102,17 @@ private slots:
         QCOMPARE(second.size(), 10);
     }
 
+    void aQueueThatTakesNoJobIsReported()
+    {
+        qputenv("CUPS_SERVER", "/nonexistent/cups.sock"); // no print system reachable
+        CScriptedPrompt prompt;
+        prompt.printerAnswers.push_back("NoSuchQueue");
+        const auto event = EventWithLines("A", 1);
+        QVERIFY(!PrintDataItems(prompt, {event.get()}));
+        QCOMPARE(prompt.Only().caption, std::string("Print"));
+        QVERIFY(prompt.Only().text.rfind("Unable to print on NoSuchQueue: ", 0) == 0);
+    }
+
     void cancelledPrintDialogPrintsNothing()
     {
         CScriptedPrompt prompt;

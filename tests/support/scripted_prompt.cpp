@@ -147,5 +147,5 @@ bool CScriptedPrompt::ChoosePrinter(std::string& printerName, std::string& pdfPa
 {
     dialogs.push_back("ChoosePrinter");
     printerName.clear();
-    return Take(pdfAnswers, pdfPath);
+    return Take(pdfAnswers, pdfPath) || Take(printerAnswers, printerName);
 }

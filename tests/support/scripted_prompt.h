@@ -55,7 +55,8 @@ public:
     std::vector<std::string> opened;         // paths handed to the desktop
     std::deque<std::string> folderAnswers;   // ChooseFolder; none left: cancelled
     std::deque<std::string> saveFileAnswers; // GetSaveFileName; none left: cancelled
-    std::deque<std::string> pdfAnswers;      // ChoosePrinter prints to these PDF files
+    std::deque<std::string> pdfAnswers;      // ChoosePrinter prints to these PDF files,
+    std::deque<std::string> printerAnswers;  // then to these print queues
     std::vector<std::string> dialogs;        // names of the dialogs run, in order
 
     Script<CSelectFolderFields> selectFolder;
