@@ -60,7 +60,6 @@ private slots:
     void lineBreakPathsSkipped();
     void symbolicLinkLoop();
     void fileVanishingDuringLoad();
-    void unreadableSubFolder();
     void cancelledLoadChangesNothing();
     void duplicateRule_data();
     void duplicateRule();
@@ -232,21 +231,6 @@ void TestDocumentLoad::fileVanishingDuringLoad()
     QCOMPARE(f.prompt.shown.back().text, std::string("Successfully loaded 2 documents."));
     for (const auto& item : f.doc.GetDocuments())
         QVERIFY(item->GetOriginalPathname() != gone);
-}
-
-void TestDocumentLoad::unreadableSubFolder()
-{
-    if (::geteuid() == 0)
-        QSKIP("root reads every folder");
-    CCommandFixture f;
-    f.MakeFile("src/a.txt");
-    const std::string locked = f.MakeFolder("src/locked");
-    f.MakeFile("src/locked/b.txt");
-    QFile::setPermissions(QString::fromStdString(locked), QFileDevice::Permissions());
-    Load(f, "src");
-    QFile::setPermissions(QString::fromStdString(locked),
-                          QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner);
-    QCOMPARE(f.prompt.Only().text, std::string("Successfully loaded 1 documents."));
 }
 
 void TestDocumentLoad::cancelledLoadChangesNothing()
