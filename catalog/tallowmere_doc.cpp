@@ -1,6 +1,7 @@
 #include "catalog/tallowmere_doc.h"
 
 #include "catalog/archive.h"
+#include "catalog/file_copy.h"
 #include "catalog/prompt.h"
 #include "catalog/text_util.h"
 
@@ -31,48 +32,6 @@ std::string FolderOf(const std::string& path)
 std::string OsErrorText(int osError)
 {
     return CAppFolders::FileErrorText(CAppFolders::FileErrorCode(osError));
-}
-
-bool WriteAllTo(int fd, const char* data, size_t size)
-{
-    while (size > 0) {
-        const ssize_t n = ::write(fd, data, size);
-        if (n < 0 && errno == EINTR)
-            continue;
-        if (n <= 0)
-            return false;
-        data += n;
-        size -= static_cast<size_t>(n);
-    }
-    return true;
-}
-
-// Copies a file byte for byte into a new file (for the backup where the file
-// system has no hard links).
-bool CopyForBackup(const std::string& from, const std::string& to)
-{
-    const int in = ::open(from.c_str(), O_RDONLY | O_CLOEXEC);
-    if (in < 0)
-        return false;
-    const int out = ::open(to.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0600);
-    bool ok = out >= 0;
-    char buffer[1 << 16];
-    while (ok) {
-        const ssize_t n = ::read(in, buffer, sizeof buffer);
-        if (n < 0 && errno == EINTR)
-            continue;
-        if (n <= 0) {
-            ok = n == 0;
-            break;
-        }
-        ok = WriteAllTo(out, buffer, static_cast<size_t>(n));
-    }
-    ::close(in);
-    if (out >= 0) {
-        ok = ::fsync(out) == 0 && ok;
-        ok = ::close(out) == 0 && ok;
-    }
-    return ok;
 }
 
 void SyncFolder(const std::string& folder)
@@ -233,8 +192,10 @@ bool CTallowmereDoc::WriteFile(std::string& error)
         const std::string backup = m_dataFilePath + ".bak";
         const std::string backupTemp = backup + ".new";
         ::unlink(backupTemp.c_str());
+        CCopyOptions replace;
+        replace.overwrite = true;
         const bool kept = ::link(m_dataFilePath.c_str(), backupTemp.c_str()) == 0 ||
-                          CopyForBackup(m_dataFilePath, backupTemp);
+                          CopyFileTo(m_dataFilePath, backupTemp, replace) == 0;
         if (!kept || ::rename(backupTemp.c_str(), backup.c_str()) != 0) {
             osError = errno ? errno : EIO;
             ::unlink(backupTemp.c_str());
